@@ -1,0 +1,23 @@
+#pragma once
+#include <string>
+
+namespace quire {
+
+class BookImplT;
+
+// Which part of a file a load reads.
+struct LoadRequest {
+    int sheetIndex = -1;   // -1: every sheet
+    int firstRow = -1;     // rows of the selected sheet, inclusive; -1: no bound
+    int lastRow = -1;
+    bool infoOnly = false; // globals only, no sheet objects
+    bool skipBlanks = true;
+};
+
+// Reads a binary workbook (compound file bytes) into a book that was reset to new.
+void readWorkbook(BookImplT& book, const std::string& fileBytes, const LoadRequest& request);
+
+// Serialises the book as a compound file holding its workbook stream.
+std::string writeWorkbook(BookImplT& book);
+
+}  // namespace quire
