@@ -86,6 +86,21 @@ int main(void) {
     printf("the date cell unpacks to %04d-%02d-%02d\n", year, month, day);
     int ok = check(book, qrSheetWriteNumW(sales, 70000, 0, 1, 0) == 0, "refusing row 70000");
     printf("writing row 70000 says: %s\n", qrBookErrorMessageW(book));
+
+    ok = check(book, qrBookSaveW(book, L"example.xls"), "saving example.xls") && ok;
     qrBookReleaseW(book);
+    if (!ok) return 1;
+
+    BookHandle loaded = qrCreateBookCW();
+    ok = check(loaded, qrBookLoadW(loaded, L"example.xls"), "loading example.xls");
+    if (ok) {
+        SheetHandle first = qrBookGetSheetW(loaded, 0);
+        /* Each string result lives until the sheet's next one: print one at a time. */
+        printf("example.xls loaded back: %d sheets, first \"%ls\"", qrBookSheetCountW(loaded),
+               qrSheetNameW(first));
+        printf(", A2 = \"%ls\", B2 = %g\n", qrSheetReadStrW(first, 1, 0, 0),
+               qrSheetReadNumW(first, 1, 1, 0));
+    }
+    qrBookReleaseW(loaded);
     return ok ? 0 : 1;
 }

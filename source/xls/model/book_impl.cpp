@@ -70,12 +70,20 @@ void BookImplT::resetToNew() {
     refR1C1_ = false;
     biffVersion_ = 0x0600;
     savedFile_.clear();
+    globals_.setDefaults();
     addDefaultStyles();
 }
 
 FontImplT* BookImplT::appendFont() {
     fonts_.push_back(std::make_unique<FontImplT>(this));
     return fonts_.back().get();
+}
+
+void BookImplT::clearStyles() {
+    fonts_.clear();
+    formats_.clear();
+    xfIndexes_.clear();
+    styles_.clear();
 }
 
 FormatImplT* BookImplT::appendFormat() {

@@ -16,6 +16,7 @@
 #include "font_impl.h"
 #include "format_impl.h"
 #include "shared_string_table.h"
+#include "workbook_globals.h"
 
 namespace quire {
 
@@ -146,7 +147,14 @@ public:
     bool paletteChanged() const { return paletteChanged_; }
     void setPaletteChanged(bool changed) { paletteChanged_ = changed; }
     void setBiffVersion(int version) { biffVersion_ = version; }
+    WorkbookGlobals& globals() { return globals_; }
+    void setActiveSheetIndex(int index) { activeSheet_ = index; }
+    void setTemplateFlag(bool tmpl) { template_ = tmpl; }
+    void setDate1904Flag(bool date1904) { date1904_ = date1904; }
+    std::vector<BookPicture>& pictures() { return pictures_; }
     FormatImplT* appendFormat();
+    // Drops fonts, formats and styles, for a file that brings its own.
+    void clearStyles();
     FontImplT* appendFont();
 
 private:
@@ -167,6 +175,7 @@ private:
     std::array<bool, kPaletteSize> paletteInUse_{};
     bool paletteChanged_ = false;
     SharedStringTable sst_;
+    WorkbookGlobals globals_;
     int activeSheet_ = 0;
     bool date1904_ = false;
     bool template_ = false;

@@ -7,20 +7,23 @@ namespace quire {
 uint32_t SharedStringTable::add(const std::wstring& text) {
     auto found = index_.find(text);
     if (found != index_.end()) return found->second;
-    auto index = static_cast<uint32_t>(strings_.size());
-    strings_.push_back(text);
+    auto index = static_cast<uint32_t>(entries_.size());
+    SharedStringEntry entry;
+    entry.text = text;
+    entries_.push_back(std::move(entry));
     index_.emplace(text, index);
     return index;
 }
 
-void SharedStringTable::append(std::wstring text) {
-    auto index = static_cast<uint32_t>(strings_.size());
-    index_.emplace(text, index);  // the first of equal texts stays the one found by add
-    strings_.push_back(std::move(text));
+void SharedStringTable::append(SharedStringEntry entry) {
+    auto index = static_cast<uint32_t>(entries_.size());
+    // Only plain strings are found again by text; the first of equal texts stays the one found.
+    if (entry.plain()) index_.emplace(entry.text, index);
+    entries_.push_back(std::move(entry));
 }
 
 void SharedStringTable::clear() {
-    strings_.clear();
+    entries_.clear();
     index_.clear();
 }
 

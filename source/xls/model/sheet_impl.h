@@ -239,9 +239,28 @@ public:
     std::vector<OutlineGroup>& rowGroups() { return rowGroups_; }
     std::vector<OutlineGroup>& colGroups() { return colGroups_; }
     int tabColor() const { return tabColor_; }
+    void setTabColorIndex(int color) { tabColor_ = color; }
     uint16_t defColWidth = 8;          // DefColWidth, characters
     uint16_t defaultRowHeight = 255;   // DefaultRowHeight miyRw, twentieths of a point
-    std::vector<KeptRecord> keptRecords;  // records read but not modelled, written back
+    // Records read but not modelled, written back at their place: before the cells, between
+    // the cells and the view settings (drawings and notes), and after the view settings.
+    std::vector<KeptRecord> keptBeforeCells;
+    std::vector<KeptRecord> keptAfterCells;
+    std::vector<KeptRecord> keptAfterView;
+    // Calculation settings: CalcMode, CalcCount, CalcIter, CalcSaveRecalc, CalcDelta.
+    uint16_t calcMode = 1;
+    uint16_t calcCount = 100;
+    uint16_t calcIter = 0;
+    uint16_t calcSaveRecalc = 1;
+    double calcDelta = 0.001;
+    uint16_t gridSet = 1;
+    uint16_t defaultRowHeightFlags = 0;
+    std::vector<KeptRecord> printerSettings;  // Pls with its CONTINUE records, kept before Setup
+    std::vector<std::vector<uint8_t>> selections;  // Selection payloads, one per pane
+    // A chart or macro sheet: its whole substream, BOF to EOF, written back as it came.
+    std::vector<KeptRecord> rawSubstream;
+    uint16_t standardWidth = 0;        // StandardWidth, 1/256 of a character; 0 when absent
+    std::vector<uint8_t> sheetExt;     // SheetExt as loaded (tab colour and more)
     void invalidateUsedRange() { usedRangeValid_ = false; }
 
 private:
