@@ -12,7 +12,9 @@ class BookMessage {
 public:
     const char* c_str() const { return text_.c_str(); }
     const std::string& text() const { return text_; }
-    void ok() { text_.assign("ok"); }
+    void ok() {
+        if (text_.size() != 2 || text_[0] != 'o' || text_[1] != 'k') text_.assign("ok");
+    }
     void set(const char* text) { text_.assign(text); }
     void set(const std::string& text) { text_ = text; }
 

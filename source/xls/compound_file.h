@@ -70,6 +70,8 @@ public:
     // The bytes of the "Workbook" (or "Book") stream; throws
     // "workbook is encrypted" for an encrypted file.
     const std::vector<uint8_t>& workbookStream() const;
+    // Moves the workbook stream out and frees the file's bytes; the container is empty after.
+    std::vector<uint8_t> takeWorkbookStream();
     // The directory name of the workbook stream ("Workbook" or "Book" as stored).
     std::u16string workbookStreamName() const;
 

@@ -287,6 +287,15 @@ const std::vector<uint8_t>& Xls::workbookStream() const
     return workbook_;
 }
 
+std::vector<uint8_t> Xls::takeWorkbookStream()
+{
+    workbookStream();  // the same checks
+    std::vector<uint8_t> stream = std::move(workbook_);
+    workbook_ = std::vector<uint8_t>();
+    input_ = std::vector<uint8_t>();
+    return stream;
+}
+
 std::u16string Xls::workbookStreamName() const
 {
     return workbookEntry_ == SIZE_MAX ? std::u16string() : dir_[workbookEntry_].nameString();

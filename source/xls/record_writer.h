@@ -15,6 +15,7 @@ namespace quire::xls {
 class RecordWriter {
 public:
     size_t position() const { return bytes_.size(); }
+    void reserve(size_t bytes) { bytes_.reserve(bytes); }
     const std::vector<uint8_t>& bytes() const { return bytes_; }
     std::vector<uint8_t> take() { return std::move(bytes_); }
 

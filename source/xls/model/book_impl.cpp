@@ -29,11 +29,24 @@ bool sameSheetName(const std::wstring& a, const std::wstring& b) {
     return true;
 }
 
-std::string readWholeFile(const std::string& path, const char* failure) {
-    std::ifstream in(path, std::ios::binary);
+std::vector<uint8_t> readWholeFile(const std::string& path, const char* failure) {
+    std::FILE* in = std::fopen(path.c_str(), "rb");
     if (!in) throw qrerror(failure);
-    std::string bytes((std::istreambuf_iterator<char>(in)), std::istreambuf_iterator<char>());
-    if (in.bad()) throw qrerror(failure);
+    std::vector<uint8_t> bytes;
+    bool ok = std::fseek(in, 0, SEEK_END) == 0;
+    long size = ok ? std::ftell(in) : -1;
+    ok = ok && size >= 0 && std::fseek(in, 0, SEEK_SET) == 0;
+    if (ok) {
+        try {
+            bytes.resize(static_cast<size_t>(size));
+        } catch (...) {
+            std::fclose(in);
+            throw;
+        }
+        ok = std::fread(bytes.data(), 1, bytes.size(), in) == bytes.size();
+    }
+    std::fclose(in);
+    if (!ok) throw qrerror(failure);
     return bytes;
 }
 
@@ -145,12 +158,12 @@ bool BookImplT::loadPartially(const wchar_t* fileName, int sheetIndex, int first
     bool loaded = message_.guard(false, [&] {
         resetToNew();
         if (!fileName) throw qrerror("file name name can't be 0");
-        std::string bytes = readWholeFile(narrowFileName(fileName), "can't open file for reading");
+        std::vector<uint8_t> bytes = readWholeFile(narrowFileName(fileName), "can't open file for reading");
         LoadRequest request;
         request.sheetIndex = sheetIndex;
         request.firstRow = firstRow;
         request.lastRow = lastRow;
-        readWorkbook(*this, bytes, request);
+        readWorkbook(*this, std::move(bytes), request);
         return true;
     });
     if (!loaded) resetToNew();
@@ -161,10 +174,10 @@ bool BookImplT::loadInfo(const wchar_t* fileName) {
     bool loaded = message_.guard(false, [&] {
         resetToNew();
         if (!fileName) throw qrerror("file name name can't be 0");
-        std::string bytes = readWholeFile(narrowFileName(fileName), "can't open file for reading");
+        std::vector<uint8_t> bytes = readWholeFile(narrowFileName(fileName), "can't open file for reading");
         LoadRequest request;
         request.infoOnly = true;
-        readWorkbook(*this, bytes, request);
+        readWorkbook(*this, std::move(bytes), request);
         return true;
     });
     if (!loaded) resetToNew();
@@ -176,7 +189,8 @@ bool BookImplT::loadRaw(const char* data, unsigned size, int, int, int) {
         resetToNew();
         LoadRequest request;
         request.skipBlanks = false;
-        readWorkbook(*this, std::string(data ? data : "", data ? size : 0), request);
+        const auto* bytes = reinterpret_cast<const uint8_t*>(data);
+        readWorkbook(*this, std::vector<uint8_t>(bytes, bytes + (data ? size : 0)), request);
         return true;
     });
     if (!loaded) resetToNew();
@@ -186,7 +200,7 @@ bool BookImplT::loadRaw(const char* data, unsigned size, int, int, int) {
 bool BookImplT::save(const wchar_t* fileName, bool) {
     return message_.guard(false, [&] {
         if (!fileName) throw qrerror("file name can't be 0");
-        std::string bytes = writeWorkbook(*this);
+        std::vector<uint8_t> bytes = writeWorkbook(*this);
         std::string path = narrowFileName(fileName);
         std::FILE* out = std::fopen(path.c_str(), "wb");
         if (!out) throw qrerror("can't open file for writing");
@@ -200,7 +214,7 @@ bool BookImplT::save(const wchar_t* fileName, bool) {
 bool BookImplT::saveRaw(const char** data, unsigned* size) {
     return message_.guard(false, [&] {
         savedFile_ = writeWorkbook(*this);
-        if (data) *data = savedFile_.data();
+        if (data) *data = reinterpret_cast<const char*>(savedFile_.data());
         if (size) *size = static_cast<unsigned>(savedFile_.size());
         return true;
     });
@@ -560,9 +574,9 @@ int BookImplT::getPicture(int index, const char** data, unsigned* size) {
 int BookImplT::addPicture(const wchar_t* fileName) {
     return message_.guard(-1, [&] {
         if (!fileName) throw qrerror("file name can't be 0");
-        std::string bytes = readWholeFile(narrowFileName(fileName), "can't open file");
+        std::vector<uint8_t> bytes = readWholeFile(narrowFileName(fileName), "can't open file");
         if (bytes.empty()) throw qrerror("picture is empty");
-        return addPicture2(bytes.data(), static_cast<unsigned>(bytes.size()));
+        return addPicture2(reinterpret_cast<const char*>(bytes.data()), static_cast<unsigned>(bytes.size()));
     });
 }
 

@@ -184,7 +184,7 @@ private:
     int biffVersion_ = 0x0600;
     LocaleSettings locale_;
     std::wstring stringResult_;
-    std::string savedFile_;
+    std::vector<uint8_t> savedFile_;
 };
 
 }  // namespace quire

@@ -1,7 +1,6 @@
 #pragma once
 #include <cstdint>
 #include <string>
-#include <unordered_map>
 #include <vector>
 
 namespace quire {
@@ -20,7 +19,8 @@ struct SharedStringEntry {
 // The book's shared strings: each distinct plain text once, found again by its text.
 class SharedStringTable {
 public:
-    uint32_t add(const std::wstring& text);
+    uint32_t add(const wchar_t* text, size_t length);
+    uint32_t add(const std::wstring& text) { return add(text.data(), text.size()); }
     // Appends as loaded, keeping duplicates so that loaded indexes stay valid.
     void append(SharedStringEntry entry);
     const std::wstring& at(uint32_t index) const { return entries_.at(index).text; }
@@ -30,8 +30,15 @@ public:
     void clear();
 
 private:
+    // Open addressing over entry numbers (plus one; 0 is a free slot), found by the text's hash.
+    static size_t hashOf(const wchar_t* text, size_t length);
+    size_t findSlot(const wchar_t* text, size_t length, size_t hash) const;
+    void insertIndex(uint32_t entry);
+    void growIndex();
+
     std::vector<SharedStringEntry> entries_;
-    std::unordered_map<std::wstring, uint32_t> index_;
+    std::vector<uint32_t> slots_;
+    size_t indexed_ = 0;
 };
 
 }  // namespace quire

@@ -1,5 +1,6 @@
 // Cell reads and writes of a binary sheet.
 #include <cstring>
+#include <cwchar>
 
 #include "api/number_formats.h"
 #include "api/wide_text.h"
@@ -171,9 +172,11 @@ bool SheetImplT::writeStr(int row, int col, const wchar_t* value, IFormatT<wchar
     return message().guard(false, [&] {
         checkCell(row, col);
         if (!value) throw qrerror("string can't be 0");
-        if (utf16Length(value) > kMaxStringUnits) throw qrerror("string is too long");
+        size_t length = std::wcslen(value);
+        if (length > kMaxStringUnits / 2 && utf16Length(value) > kMaxStringUnits)
+            throw qrerror("string is too long");
         uint16_t xf = xfForWrite(row, col, format);
-        uint32_t isst = book_->sharedStrings().add(value);
+        uint32_t isst = book_->sharedStrings().add(value, length);
         uint32_t w = cells_.word(row, col);
         if (CellStore::kindOf(w) == CellKind::LabelSst) {
             LabelSstCell& cell = cells_.labelSst(w);

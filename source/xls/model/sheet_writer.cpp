@@ -1,5 +1,6 @@
 // Writing a worksheet substream, in the record order spreadsheet programs expect.
 #include <algorithm>
+#include <cstring>
 
 #include "api/wide_text.h"
 #include "book_impl.h"
@@ -262,50 +263,71 @@ void SheetWriter::writeStringRecord(const std::wstring& text) {
     out_.endRecord();
 }
 
+namespace {
+
+// Little-endian stores into a record built on the stack.
+inline void store16(uint8_t* p, uint16_t v) {
+    p[0] = static_cast<uint8_t>(v);
+    p[1] = static_cast<uint8_t>(v >> 8);
+}
+inline void store32(uint8_t* p, uint32_t v) {
+    for (int i = 0; i < 4; ++i) p[i] = static_cast<uint8_t>(v >> (8 * i));
+}
+inline void storePosition(uint8_t* p, const CellPosition& cell) {
+    store16(p, cell.rw);
+    store16(p + 2, cell.col);
+    store16(p + 4, cell.ixfe);
+}
+
+}  // namespace
+
 void SheetWriter::writeCells() {
     CellStore& cells = sheet_.cells();
     const SharedStringTable& strings = sheet_.book()->sharedStrings();
+    uint8_t fixed[16];
     for (size_t row = 0; row < cells.rowCount(); ++row) {
         const auto& words = cells.rowWords(row);
         for (size_t col = 0; col < words.size(); ++col) {
             uint32_t w = words[col];
             if (!(w & 1u)) continue;
-            data_.clear();
             switch (CellStore::kindOf(w)) {
                 case CellKind::Rk: {
                     const RkCell& c = cells.rk(w);
-                    putU16(data_, c.rw); putU16(data_, c.col); putU16(data_, c.ixfe); putU32(data_, c.rk);
-                    record(Rec::Rk);
+                    storePosition(fixed, c);
+                    store32(fixed + 6, c.rk);
+                    out_.writeRecord(Rec::Rk, fixed, 10);
                     break;
                 }
                 case CellKind::Number: {
                     const NumberCell& c = cells.number(w);
-                    putU16(data_, c.rw); putU16(data_, c.col); putU16(data_, c.ixfe); putF64(data_, c.num);
-                    record(Rec::Number);
+                    storePosition(fixed, c);
+                    std::memcpy(fixed + 6, &c.num, 8);
+                    out_.writeRecord(Rec::Number, fixed, 14);
                     break;
                 }
                 case CellKind::LabelSst: {
                     const LabelSstCell& c = cells.labelSst(w);
                     if (!strings.contains(c.isst)) throw qrerror("StrMap: sst is out of range (2)");
-                    putU16(data_, c.rw); putU16(data_, c.col); putU16(data_, c.ixfe); putU32(data_, c.isst);
-                    record(Rec::LabelSst);
+                    storePosition(fixed, c);
+                    store32(fixed + 6, c.isst);
+                    out_.writeRecord(Rec::LabelSst, fixed, 10);
                     break;
                 }
-                case CellKind::Blank: {
-                    const BlankCell& c = cells.blank(w);
-                    putU16(data_, c.rw); putU16(data_, c.col); putU16(data_, c.ixfe);
-                    record(Rec::Blank);
+                case CellKind::Blank:
+                    storePosition(fixed, cells.blank(w));
+                    out_.writeRecord(Rec::Blank, fixed, 6);
                     break;
-                }
                 case CellKind::BoolErr: {
                     const BoolErrCell& c = cells.boolErr(w);
-                    putU16(data_, c.rw); putU16(data_, c.col); putU16(data_, c.ixfe);
-                    putU8(data_, c.bBoolErr); putU8(data_, c.fError);
-                    record(Rec::BoolErr);
+                    storePosition(fixed, c);
+                    fixed[6] = c.bBoolErr;
+                    fixed[7] = c.fError;
+                    out_.writeRecord(Rec::BoolErr, fixed, 8);
                     break;
                 }
                 case CellKind::Label: {
                     const LabelCell& c = cells.label(w);
+                    data_.clear();
                     putU16(data_, c.rw); putU16(data_, c.col); putU16(data_, c.ixfe);
                     appendUnicodeString(data_, c.text, false);
                     record(Rec::Label);

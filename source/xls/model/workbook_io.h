@@ -1,5 +1,6 @@
 #pragma once
-#include <string>
+#include <cstdint>
+#include <vector>
 
 namespace quire {
 
@@ -15,9 +16,9 @@ struct LoadRequest {
 };
 
 // Reads a binary workbook (compound file bytes) into a book that was reset to new.
-void readWorkbook(BookImplT& book, const std::string& fileBytes, const LoadRequest& request);
+void readWorkbook(BookImplT& book, std::vector<uint8_t> fileBytes, const LoadRequest& request);
 
 // Serialises the book as a compound file holding its workbook stream.
-std::string writeWorkbook(BookImplT& book);
+std::vector<uint8_t> writeWorkbook(BookImplT& book);
 
 }  // namespace quire

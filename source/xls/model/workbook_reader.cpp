@@ -211,15 +211,17 @@ void keepWholeSubstream(SheetImplT& sheet, xls::RecordReader& reader) {
 
 }  // namespace
 
-void readWorkbook(BookImplT& book, const std::string& fileBytes, const LoadRequest& request) {
+void readWorkbook(BookImplT& book, std::vector<uint8_t> fileBytes, const LoadRequest& request) {
     // A bare record stream without a compound file is an old (BIFF2 to BIFF4) workbook.
-    if (fileBytes.size() >= 4 && static_cast<uint8_t>(fileBytes[1]) <= 0x08 &&
-        static_cast<uint8_t>(fileBytes[0]) == 0x09 &&
+    if (fileBytes.size() >= 4 && fileBytes[0] == 0x09 &&
         (fileBytes[1] == 0x00 || fileBytes[1] == 0x02 || fileBytes[1] == 0x04 || fileBytes[1] == 0x08))
         throw qrerror("This file format isn't supported");
-    xls::Xls container;
-    container.open(reinterpret_cast<const uint8_t*>(fileBytes.data()), fileBytes.size());
-    const std::vector<uint8_t>& stream = container.workbookStream();
+    std::vector<uint8_t> stream;
+    {
+        xls::Xls container;
+        container.open(std::move(fileBytes));
+        stream = container.takeWorkbookStream();
+    }
     xls::RecordReader reader(stream);
 
     // Parsing the globals replaces the defaults of a new book with what the file holds.

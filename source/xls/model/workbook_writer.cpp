@@ -157,9 +157,12 @@ std::vector<size_t> GlobalsWriter::run() {
 
 }  // namespace
 
-std::string writeWorkbook(BookImplT& book) {
+std::vector<uint8_t> writeWorkbook(BookImplT& book) {
     if (book.sheets().empty()) throw qrerror("workbook must contain at least one sheet");
     xls::RecordWriter out;
+    size_t cells = 0;
+    for (const auto& sheet : book.sheets()) cells += sheet->cells().cellCount();
+    out.reserve(4096 + cells * 16);
     std::vector<size_t> positions = GlobalsWriter(book, out).run();
     for (size_t i = 0; i < book.sheets().size(); ++i) {
         out.patchUInt32(positions[i], static_cast<uint32_t>(out.position()));
@@ -169,7 +172,7 @@ std::string writeWorkbook(BookImplT& book) {
     container.setWorkbookStream(out.take());
     std::vector<uint8_t> file;
     container.close(file);
-    return std::string(file.begin(), file.end());
+    return file;
 }
 
 }  // namespace quire
