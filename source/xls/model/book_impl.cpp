@@ -10,24 +10,12 @@
 #include "api/wide_text.h"
 #include "api/book_factory.h"
 #include "api/picture_type.h"
+#include "api/sheet_names.h"
 #include "sheet_impl.h"
 #include "workbook_io.h"
 
 namespace quire {
 namespace {
-
-constexpr size_t kMaxSheetNameUnits = 31;
-
-bool sameSheetName(const std::wstring& a, const std::wstring& b) {
-    if (a.size() != b.size()) return false;
-    for (size_t i = 0; i < a.size(); ++i) {
-        wchar_t x = a[i], y = b[i];
-        if (x >= L'a' && x <= L'z') x = static_cast<wchar_t>(x - 32);
-        if (y >= L'a' && y <= L'z') y = static_cast<wchar_t>(y - 32);
-        if (x != y) return false;
-    }
-    return true;
-}
 
 std::vector<uint8_t> readWholeFile(const std::string& path, const char* failure) {
     std::FILE* in = std::fopen(path.c_str(), "rb");
@@ -84,6 +72,9 @@ void BookImplT::resetToNew() {
     biffVersion_ = 0x0600;
     savedFile_.clear();
     globals_.setDefaults();
+    names_.clear();
+    externSheets_.clear();
+    supBooks_.clear();
     addDefaultStyles();
 }
 
@@ -236,6 +227,9 @@ SheetImplT* BookImplT::createSheet(int index, const std::wstring& name,
         throw;
     }
     SheetImplT* created = sheets_[index].get();
+    std::vector<int> moved(sheets_.size() - 1);
+    for (size_t i = 0; i < moved.size(); ++i) moved[i] = static_cast<int>(i) < index ? static_cast<int>(i) : static_cast<int>(i) + 1;
+    remapSheetReferences(moved);
     if (sheets_.size() == 1) {
         activeSheet_ = 0;
     } else if (index <= activeSheet_) {
@@ -315,6 +309,15 @@ bool BookImplT::moveSheet(int srcIndex, int dstIndex) {
         sheets_.insert(sheets_.begin() + target, std::move(sheet));
         boundSheets_.insert(boundSheets_.begin() + target, record);
         if (active) activeSheet_ = sheetIndexOf(active);
+        std::vector<int> moved(static_cast<size_t>(count));
+        for (int i = 0; i < count; ++i) {
+            int position = i;
+            if (i == srcIndex) position = target;
+            else if (srcIndex < target && i > srcIndex && i <= target) position = i - 1;
+            else if (target < srcIndex && i >= target && i < srcIndex) position = i + 1;
+            moved[i] = position;
+        }
+        remapSheetReferences(moved);
         return true;
     });
 }
@@ -326,6 +329,9 @@ bool BookImplT::delSheet(int index) {
         if (count == 1) throw qrerror("can't remove the last sheet in workbook");
         sheets_.erase(sheets_.begin() + index);
         boundSheets_.erase(boundSheets_.begin() + index);
+        std::vector<int> moved(static_cast<size_t>(count));
+        for (int i = 0; i < count; ++i) moved[i] = i < index ? i : (i == index ? -1 : i - 1);
+        remapSheetReferences(moved);
         if (activeSheet_ > index || activeSheet_ >= count - 1) --activeSheet_;
         if (activeSheet_ < 0) activeSheet_ = 0;
         for (int i = 0; i < sheetCount(); ++i) sheets_[i]->setSelected(i == activeSheet_);

@@ -13,6 +13,7 @@
 #include "api/number_formats.h"
 #include "api/palette.h"
 #include "cell_store.h"
+#include "defined_names.h"
 #include "font_impl.h"
 #include "format_impl.h"
 #include "shared_string_table.h"
@@ -148,6 +149,16 @@ public:
     void setPaletteChanged(bool changed) { paletteChanged_ = changed; }
     void setBiffVersion(int version) { biffVersion_ = version; }
     WorkbookGlobals& globals() { return globals_; }
+    std::vector<DefinedName>& names() { return names_; }
+    std::vector<XtiEntry>& externSheets() { return externSheets_; }
+    std::vector<SupBookBlock>& supBooks() { return supBooks_; }
+    // The XTI index of sheets first..last of this book, added (with the self-reference SupBook)
+    // when missing and `create` is set; -1 otherwise.
+    int externSheetIndex(int firstSheet, int lastSheet, bool create);
+    // The sheet an XTI entry of this book names when it names exactly one; -1 otherwise.
+    int sheetOfExternSheet(unsigned xti) const;
+    // Follows a change of sheet positions: oldToNew[i] is the new index of sheet i, -1 if deleted.
+    void remapSheetReferences(const std::vector<int>& oldToNew);
     void setActiveSheetIndex(int index) { activeSheet_ = index; }
     void setTemplateFlag(bool tmpl) { template_ = tmpl; }
     void setDate1904Flag(bool date1904) { date1904_ = date1904; }
@@ -176,6 +187,9 @@ private:
     bool paletteChanged_ = false;
     SharedStringTable sst_;
     WorkbookGlobals globals_;
+    std::vector<DefinedName> names_;
+    std::vector<XtiEntry> externSheets_;
+    std::vector<SupBookBlock> supBooks_;
     int activeSheet_ = 0;
     bool date1904_ = false;
     bool template_ = false;

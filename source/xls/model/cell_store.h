@@ -39,8 +39,7 @@ struct FormulaCell : CellPosition {
     std::wstring text;                 // a string result
     uint16_t grbit = 0;
     uint32_t chn = 0;
-    std::vector<uint8_t> formula;      // the parsed formula as stored in the record
-    std::wstring source;               // the text it was written from, when written through the API
+    std::vector<uint8_t> formula;      // the parsed formula as stored in the record (cce, rgce, rgcb)
     std::vector<KeptRecord> before;    // records kept in front of it
     std::vector<KeptRecord> shared;    // a shared-formula or array record kept with it
     std::vector<KeptRecord> after;     // records kept behind it

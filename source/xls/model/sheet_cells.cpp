@@ -4,8 +4,12 @@
 
 #include "api/number_formats.h"
 #include "api/wide_text.h"
+#include "book_formula_context.h"
 #include "book_impl.h"
 #include "sheet_impl.h"
+#include "xls/formula/formula_compiler.h"
+#include "xls/formula/formula_printer.h"
+#include "xls/formula/ptg_reader.h"
 
 namespace quire {
 namespace {
@@ -176,6 +180,7 @@ bool SheetImplT::writeStr(int row, int col, const wchar_t* value, IFormatT<wchar
         if (length > kMaxStringUnits / 2 && utf16Length(value) > kMaxStringUnits)
             throw qrerror("string is too long");
         uint16_t xf = xfForWrite(row, col, format);
+        releaseSharedFormula(row, col);
         uint32_t isst = book_->sharedStrings().add(value, length);
         uint32_t w = cells_.word(row, col);
         if (CellStore::kindOf(w) == CellKind::LabelSst) {
@@ -238,7 +243,9 @@ void SheetImplT::storeNumber(int row, int col, uint16_t xf, double value) {
 bool SheetImplT::writeNum(int row, int col, double value, IFormatT<wchar_t>* format) {
     return message().guard(false, [&] {
         checkCell(row, col);
-        storeNumber(row, col, xfForWrite(row, col, format), value);
+        uint16_t xf = xfForWrite(row, col, format);
+        releaseSharedFormula(row, col);
+        storeNumber(row, col, xf, value);
         return true;
     });
 }
@@ -267,6 +274,7 @@ bool SheetImplT::writeBool(int row, int col, bool value, IFormatT<wchar_t>* form
     return message().guard(false, [&] {
         checkCell(row, col);
         uint16_t xf = xfForWrite(row, col, format);
+        releaseSharedFormula(row, col);
         bool isError = errorCode != ErrorTypeNoError;
         auto stored = static_cast<uint8_t>(isError ? errorCode : (value ? 1 : 0));
         bool existed = cells_.exists(row, col);
@@ -295,11 +303,41 @@ bool SheetImplT::writeBlank(int row, int col, IFormatT<wchar_t>* format) {
     return message().guard(false, [&] {
         checkCell(row, col);
         uint16_t xf = xfForWrite(row, col, format);
+        releaseSharedFormula(row, col);
         bool existed = cells_.exists(row, col);
         cells_.putBlank(row, col, xf);
         if (!existed) invalidateUsedRange();
         return true;
     });
+}
+
+// The tokens a formula cell stands for: its own, or those of the shared or array formula
+// its single ptgExp token points at.
+std::wstring SheetImplT::formulaText(const FormulaCell& cell, int row, int col) {
+    BookFormulaContext context(*book_);
+    xls::FormulaOrigin origin;
+    origin.sheet = ownIndex();
+    origin.row = row;
+    origin.col = col;
+    xls::ParsedFormula parsed = xls::ParsedFormula::fromCellParsedFormula(cell.formula.data(), cell.formula.size());
+    uint16_t anchorRow = 0, anchorCol = 0;
+    if (!xls::sharedFormulaAnchor(parsed.rgce.data(), parsed.rgce.size(), anchorRow, anchorCol))
+        return xls::toInfix(parsed, context, origin);
+    const FormulaCell* anchor = formulaAt(anchorRow, anchorCol);
+    if (anchor) {
+        for (const auto& record : anchor->shared) {
+            // SharedFmla: RefU (6 bytes), reserved, cUse; Array: RefU, grbit u16, chn u32.
+            size_t skip = record.id == 0x04BC ? 8 : record.id == 0x0221 ? 12 : 0;
+            if (skip == 0 || record.data.size() < skip + 2) continue;
+            const uint8_t* d = record.data.data();
+            int firstRow = d[0] | (d[1] << 8), lastRow = d[2] | (d[3] << 8);
+            int firstCol = d[4], lastCol = d[5];
+            if (row < firstRow || row > lastRow || col < firstCol || col > lastCol) continue;
+            xls::ParsedFormula body = xls::ParsedFormula::fromCellParsedFormula(d + skip, record.data.size() - skip);
+            return xls::toInfix(body, context, origin);
+        }
+    }
+    throw qrerror("toInfix error: formula refers to a shared or array formula");
 }
 
 const wchar_t* SheetImplT::readFormula(int row, int col, IFormatT<wchar_t>** format) {
@@ -308,10 +346,57 @@ const wchar_t* SheetImplT::readFormula(int row, int col, IFormatT<wchar_t>** for
         checkCell(row, col);
         FormulaCell* cell = formulaAt(row, col);
         if (!cell) throw qrerror("cell doesn't contain a formula");
-        if (cell->source.empty()) throw qrerror("formula can't be printed: formula text is not available");
+        std::wstring text = formulaText(*cell, row, col);
         setFormatOut(format, row, col);
-        return returnString(cell->source);
+        return returnString(text);
     });
+}
+
+// Before the first cell of a shared formula changes, the other cells that use the shared
+// tokens get tokens of their own, so that none is left pointing at a formula that is gone.
+void SheetImplT::releaseSharedFormula(int row, int col) {
+    FormulaCell* anchor = formulaAt(row, col);
+    if (!anchor || anchor->shared.empty()) return;
+    std::vector<uint8_t> range;
+    bool shared = false;
+    for (const auto& record : anchor->shared) {
+        if ((record.id == 0x04BC || record.id == 0x0221 || record.id == 0x0236) && record.data.size() >= 6) {
+            range = record.data;
+            shared = record.id == 0x04BC;
+        }
+    }
+    if (range.empty()) return;
+    int firstRow = range[0] | (range[1] << 8), lastRow = range[2] | (range[3] << 8);
+    int firstCol = range[4], lastCol = range[5];
+    BookFormulaContext context(*book_);
+    int sheet = ownIndex();
+    for (int r = firstRow; r <= lastRow; ++r) {
+        for (int c = firstCol; c <= lastCol; ++c) {
+            if (r == row && c == col) continue;
+            FormulaCell* user = formulaAt(r, c);
+            if (!user) continue;
+            xls::ParsedFormula parsed = xls::ParsedFormula::fromCellParsedFormula(user->formula.data(), user->formula.size());
+            uint16_t anchorRow = 0, anchorCol = 0;
+            if (!xls::sharedFormulaAnchor(parsed.rgce.data(), parsed.rgce.size(), anchorRow, anchorCol) ||
+                anchorRow != row || anchorCol != col)
+                continue;
+            if (shared) {
+                std::wstring text = formulaText(*user, r, c);
+                user->formula = xls::MakeFormula(text, context, sheet).cellParsedFormula();
+                continue;
+            }
+            // A cell of an array formula or data table cannot stand alone: its result stays.
+            FormulaCell value = *user;
+            switch (value.result) {
+                case FormulaResult::String: cells_.putLabel(r, c, value.ixfe, value.text); break;
+                case FormulaResult::Boolean: cells_.putBoolErr(r, c, value.ixfe, value.boolOrError, 0); break;
+                case FormulaResult::Error: cells_.putBoolErr(r, c, value.ixfe, value.boolOrError, 1); break;
+                case FormulaResult::Blank: cells_.putBlank(r, c, value.ixfe); break;
+                default: storeNumber(r, c, value.ixfe, value.num); break;
+            }
+        }
+    }
+    if (FormulaCell* cell = formulaAt(row, col)) cell->shared.clear();
 }
 
 void SheetImplT::storeFormula(int row, int col, const wchar_t* expr, IFormatT<wchar_t>* format,
@@ -319,13 +404,16 @@ void SheetImplT::storeFormula(int row, int col, const wchar_t* expr, IFormatT<wc
     checkCell(row, col);
     if (!expr) throw qrerror("formula can't be 0");
     uint16_t xf = xfForWrite(row, col, format);
+    BookFormulaContext context(*book_);
+    xls::ParsedFormula parsed = xls::MakeFormula(expr, context, ownIndex());
+    releaseSharedFormula(row, col);
     FormulaCell cell;
+    cell.formula = parsed.cellParsedFormula();
     cell.ixfe = xf;
     cell.result = result;
     cell.num = num;
     cell.boolOrError = flag ? 1 : 0;
     if (text) cell.text = text;
-    cell.source = expr;
     bool existed = cells_.exists(row, col);
     cells_.putFormula(row, col, std::move(cell));
     if (!existed) invalidateUsedRange();

@@ -7,6 +7,7 @@
 #include "api/ISheetT.h"
 #include "api/enums.h"
 #include "cell_store.h"
+#include "defined_names.h"
 #include "sheet_settings.h"
 
 namespace quire {
@@ -264,6 +265,18 @@ public:
     void invalidateUsedRange() { usedRangeValid_ = false; }
 
 private:
+    struct Area3d {
+        uint16_t xti = 0;
+        int rowFirst = 0, rowLast = 0, colFirst = 0, colLast = 0;
+    };
+    int ownIndex() const;
+    DefinedName* builtInName(wchar_t code);
+    DefinedName& addBuiltInName(wchar_t code);
+    uint16_t ownExternSheet();
+    bool isNamedRangeOfThisSheet(const DefinedName& name, Area3d& area) const;
+    void setPrintTitle(bool rows, int first, int last);
+    bool printTitle(bool rows, int* first, int* last);
+    void shiftNamedRanges(bool rows, int from, int count);
     BookMessage& message();
     void checkCell(int row, int col) const;
     uint16_t xfForWrite(int row, int col, IFormatT<wchar_t>* format);
@@ -272,6 +285,8 @@ private:
     const wchar_t* returnString(const std::wstring& text);
     void storeNumber(int row, int col, uint16_t xf, double value);
     FormulaCell* formulaAt(int row, int col);
+    std::wstring formulaText(const FormulaCell& cell, int row, int col);
+    void releaseSharedFormula(int row, int col);
     void storeFormula(int row, int col, const wchar_t* expr, IFormatT<wchar_t>* format,
                       FormulaResult result, double num, bool flag, const wchar_t* text);
     void computeUsedRange();

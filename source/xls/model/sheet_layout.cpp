@@ -587,6 +587,7 @@ bool SheetImplT::insertRow(int rowFirst, int rowLast, bool updateReferences) {
         int count = rowLast - rowFirst + 1;
         shiftRows(rowFirst, count);
         if (updateReferences) {
+            shiftNamedRanges(true, rowFirst, count);
             shiftRefs(merges_, true, rowFirst, count, kMaxRow);
             for (auto& link : hyperlinks_) shiftSpan(link.ref.rwFirst, link.ref.rwLast, rowFirst, count, kMaxRow);
         }
@@ -605,6 +606,7 @@ bool SheetImplT::removeRow(int rowFirst, int rowLast, bool updateReferences) {
         for (int r = rowFirst; r <= rowLast; ++r) rows_.erase(r);
         shiftRows(rowLast + 1, -count);
         if (updateReferences) {
+            shiftNamedRanges(true, rowFirst, -count);
             shiftRefs(merges_, true, rowFirst, -count, kMaxRow);
             std::vector<Hyperlink> kept;
             for (auto link : hyperlinks_) {
@@ -623,6 +625,7 @@ bool SheetImplT::insertCol(int colFirst, int colLast, bool updateReferences) {
         int count = colLast - colFirst + 1;
         shiftCols(colFirst, count);
         if (updateReferences) {
+            shiftNamedRanges(false, colFirst, count);
             shiftRefs(merges_, false, colFirst, count, kMaxCol);
             for (auto& link : hyperlinks_) shiftSpan(link.ref.colFirst, link.ref.colLast, colFirst, count, kMaxCol);
         }
@@ -644,6 +647,7 @@ bool SheetImplT::removeCol(int colFirst, int colLast, bool updateReferences) {
                     cols_.end());
         shiftCols(colLast + 1, -count);
         if (updateReferences) {
+            shiftNamedRanges(false, colFirst, -count);
             shiftRefs(merges_, false, colFirst, -count, kMaxCol);
             std::vector<Hyperlink> kept;
             for (auto link : hyperlinks_) {

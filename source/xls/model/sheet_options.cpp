@@ -4,6 +4,7 @@
 
 #include "api/cell_address.h"
 #include "api/password_hash.h"
+#include "api/sheet_names.h"
 #include "api/wide_text.h"
 #include "book_impl.h"
 #include "sheet_impl.h"
@@ -11,9 +12,7 @@
 namespace quire {
 namespace {
 
-constexpr size_t kMaxSheetNameUnits = 31;
 constexpr size_t kMaxHeaderFooterUnits = 255;
-constexpr const char* kNamesPending = "named ranges of .xls sheets are not available yet";
 constexpr const char* kPicturesPending = "pictures of .xls sheets are not available yet";
 constexpr const char* kNotForXls = "function is not supported for xls files";
 
@@ -202,42 +201,6 @@ double SheetImplT::marginBottom() { message().ok(); return page_.bottomMargin; }
 void SheetImplT::setMarginBottom(double margin) { message().ok(); page_.bottomMargin = margin; }
 bool SheetImplT::printRowCol() { message().ok(); return page_.printRowCol; }
 void SheetImplT::setPrintRowCol(bool print) { message().ok(); page_.printRowCol = print; }
-
-// ---- Print titles, print area and defined names (kept as names of the book) ----
-
-bool SheetImplT::printRepeatRows(int*, int*) { message().set(kNamesPending); return false; }
-void SheetImplT::setPrintRepeatRows(int, int) { message().set(kNamesPending); }
-bool SheetImplT::printRepeatCols(int*, int*) { message().set(kNamesPending); return false; }
-void SheetImplT::setPrintRepeatCols(int, int) { message().set(kNamesPending); }
-bool SheetImplT::printArea(int*, int*, int*, int*) { message().set(kNamesPending); return false; }
-void SheetImplT::setPrintArea(int, int, int, int) { message().set(kNamesPending); }
-void SheetImplT::clearPrintRepeats() { message().set(kNamesPending); }
-void SheetImplT::clearPrintArea() { message().set(kNamesPending); }
-
-bool SheetImplT::getNamedRange(const wchar_t*, int*, int*, int*, int*, int, bool*) {
-    message().set(kNamesPending);
-    return false;
-}
-
-bool SheetImplT::setNamedRange(const wchar_t*, int, int, int, int, int) {
-    message().set(kNamesPending);
-    return false;
-}
-
-bool SheetImplT::delNamedRange(const wchar_t*, int) {
-    message().set(kNamesPending);
-    return false;
-}
-
-int SheetImplT::namedRangeSize() {
-    message().ok();
-    return 0;
-}
-
-const wchar_t* SheetImplT::namedRange(int, int*, int*, int*, int*, int*, bool*) {
-    message().set("index is out of range");
-    return nullptr;
-}
 
 // ---- Tables, hyperlinks, autofilter ----
 

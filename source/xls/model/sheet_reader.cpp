@@ -271,8 +271,20 @@ void SheetReader::readFormula(const xls::Record& r) {
         reader_.next(extra);
         cell.shared.push_back(keep(extra));
     }
-    if (cellWanted(row, col)) cells_.putFormula(row, col, std::move(cell));
+    if (!cellWanted(row, col)) return;
     lastList_ = nullptr;
+    if (!options_.biff5) {
+        cells_.putFormula(row, col, std::move(cell));
+        return;
+    }
+    // Tokens of the older version would be wrong in the file we write: keep the result only.
+    switch (cell.result) {
+        case FormulaResult::String: cells_.putLabel(row, col, cell.ixfe, cell.text); break;
+        case FormulaResult::Boolean: cells_.putBoolErr(row, col, cell.ixfe, cell.boolOrError, 0); break;
+        case FormulaResult::Error: cells_.putBoolErr(row, col, cell.ixfe, cell.boolOrError, 1); break;
+        case FormulaResult::Blank: cells_.putLabel(row, col, cell.ixfe, std::wstring()); break;
+        default: cells_.putNumber(row, col, cell.ixfe, cell.num); break;
+    }
 }
 
 // The cached text of a formula; a long one goes on in CONTINUE records, each starting with

@@ -26,7 +26,6 @@ void WorkbookGlobals::setDefaults() {
     verbatim.clear();
     xfExt.clear();
     hfPictures.clear();
-    externals.clear();
     drawingGroup.clear();
     others.clear();
     using namespace GlobalsRecord;

@@ -34,7 +34,6 @@ struct WorkbookGlobals {
     std::map<uint16_t, std::vector<KeptRecord>> verbatim;  // with their CONTINUE records
     std::vector<KeptRecord> xfExt;
     std::vector<KeptRecord> hfPictures;
-    std::vector<KeptRecord> externals;     // SupBook, ExternSheet, ExternName and Lbl, in file order
     std::vector<KeptRecord> drawingGroup;  // MsoDrawingGroup with its CONTINUE records
     std::vector<KeptRecord> others;
 

@@ -7,6 +7,7 @@
 #include "record_text.h"
 #include "sheet_impl.h"
 #include "sheet_records.h"
+#include "name_records.h"
 #include "style_records.h"
 #include "workbook_io.h"
 #include "xls/compound_file.h"
@@ -51,9 +52,9 @@ bool isVerbatim(uint16_t type) {
            std::end(kVerbatimRecords);
 }
 
-bool isExternal(uint16_t type) {
-    return type == Lbl || type == SupBook || type == ExternSheet || type == ExternName ||
-           type == 0x005A /* CRN */ || type == 0x0059 /* XCT */;
+// Records that follow a SupBook and belong to it.
+bool belongsToSupBook(uint16_t type) {
+    return type == ExternName || type == 0x005A /* CRN */ || type == 0x0059 /* XCT */;
 }
 
 KeptRecord keep(const xls::Record& record) {
@@ -73,6 +74,8 @@ private:
     void readBof(const xls::Record& record);
     void dispatch(const xls::Record& record, const xls::RecordHeader& header);
     void readBoundSheet(const xls::Record& record);
+    // The record's data with the data of the CONTINUE records after it.
+    std::vector<uint8_t> withContinues(const xls::Record& record);
 
     BookImplT& book_;
     xls::RecordReader& reader_;
@@ -129,6 +132,15 @@ void GlobalsReader::run() {
     throw qrerror("globals EOF record not found");
 }
 
+std::vector<uint8_t> GlobalsReader::withContinues(const xls::Record& record) {
+    std::vector<uint8_t> data(record.data, record.data + record.size);
+    uint16_t next = 0;
+    xls::Record more;
+    while (reader_.peekType(next) && next == Continue && reader_.next(more))
+        data.insert(data.end(), more.data, more.data + more.size);
+    return data;
+}
+
 void GlobalsReader::readBoundSheet(const xls::Record& r) {
     if (r.size < 8) throw qrerror("BoundSheet8 size is incorrect");
     quire::BoundSheet8 sheet;
@@ -172,10 +184,25 @@ void GlobalsReader::dispatch(const xls::Record& r, const xls::RecordHeader&) {
         case Continue:
             if (lastList_) lastList_->push_back(keep(r));
             return;
+        case Lbl:
+        case ExternSheet: {
+            if (biff5_) break;  // the older layouts would be wrong in the file we write
+            std::vector<uint8_t> data = withContinues(r);
+            if (r.type == Lbl) readLblRecord(book_, data.data(), data.size());
+            else readExternSheetRecord(book_, data.data(), data.size());
+            break;
+        }
+        case SupBook:
+            if (biff5_) break;
+            book_.supBooks().emplace_back();
+            book_.supBooks().back().records.push_back(keep(r));
+            keptIn = &book_.supBooks().back().records;
+            break;
         default:
-            if (isExternal(r.type)) {
-                globals.externals.push_back(keep(r));
-                keptIn = &globals.externals;
+            if (belongsToSupBook(r.type) && !book_.supBooks().empty()) {
+                if (biff5_) break;
+                book_.supBooks().back().records.push_back(keep(r));
+                keptIn = &book_.supBooks().back().records;
             } else if (isVerbatim(r.type)) {
                 auto& list = globals.verbatim[r.type];
                 list.clear();

@@ -5,6 +5,7 @@
 #include "record_text.h"
 #include "sheet_impl.h"
 #include "sheet_records.h"
+#include "name_records.h"
 #include "style_records.h"
 #include "workbook_io.h"
 #include "xls/compound_file.h"
@@ -142,7 +143,7 @@ std::vector<size_t> GlobalsWriter::run() {
     verbatim(MtrSettings);
     verbatim(ForceFullCalculation);
     single(Country);
-    kept(globals_.externals);
+    writeExternalReferencesAndNames(book_, out_);
     single(RecalcId);
     kept(globals_.hfPictures);
     kept(globals_.drawingGroup);
