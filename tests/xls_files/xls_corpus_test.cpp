@@ -3,12 +3,14 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <fstream>
 #include <memory>
 
 #include "api/book_factory.h"
 #include "api/enums.h"
 #include "cell_dump.h"
 #include "corpus.h"
+#include "external_tools.h"
 #include "xls/compound_file.h"
 
 namespace quire::test {
@@ -87,6 +89,37 @@ TEST_P(XlsCorpus, LoadsLikeAnotherReaderAndSurvivesARoundTrip) {
 }
 
 INSTANTIATE_TEST_SUITE_P(Files, XlsCorpus, ::testing::ValuesIn(xlsFiles()), testName);
+
+// Every corpus file we load and save again opens in LibreOffice: all converted in one run.
+TEST(XlsCorpusSavedFiles, OpenInLibreOffice) {
+#ifdef QUIRE_SANITIZED_BUILD
+    GTEST_SKIP() << "checked in the plain build; the sanitizers watch our own code";
+#endif
+    auto files = xlsFiles();
+    if (files.empty()) GTEST_SKIP() << "the corpus is not present";
+    if (!haveProgram("soffice")) GTEST_SKIP() << "LibreOffice is not installed";
+    std::string dir = makeTempDir("quire-resaved-");
+    std::vector<std::string> saved;
+    for (const auto& file : files) {
+        if (!file.ok) continue;
+        BookPtr book(createBinaryBook());
+        if (!book->load(std::wstring(file.path.begin(), file.path.end()).c_str(), nullptr)) continue;
+        std::string name = "f" + std::to_string(saved.size());
+        std::string path = dir + "/" + name + ".xls";
+        ASSERT_TRUE(book->save(std::wstring(path.begin(), path.end()).c_str(), false)) << file.name;
+        saved.push_back(file.name);
+    }
+    std::string output;
+    int status = runCommand("cd " + shellQuote(dir) + " && HOME=" + shellQuote(dir) +
+                                " timeout 1200 soffice --headless --norestore --convert-to csv --outdir " +
+                                shellQuote(dir + "/csv") + " " + shellQuote(dir) + "/*.xls",
+                            &output);
+    ASSERT_EQ(status, 0) << output;
+    for (size_t i = 0; i < saved.size(); ++i) {
+        std::ifstream csv(dir + "/csv/f" + std::to_string(i) + ".csv");
+        EXPECT_TRUE(csv.good()) << "LibreOffice did not open the saved copy of " << saved[i];
+    }
+}
 GTEST_ALLOW_UNINSTANTIATED_PARAMETERIZED_TEST(XlsCorpus);
 
 }  // namespace

@@ -148,6 +148,16 @@ TEST(XlsNames, OtherProgramsSeeTheNamesAndPrintAreas) {
         EXPECT_NE(output.find("Values -1 1 0 4 1 2"), std::string::npos) << output;
         EXPECT_NE(output.find("Print_Area 1 1 0 4 0 2"), std::string::npos) << output;
     }
+    if (haveProgram("soffice")) {
+        std::string output;
+        ASSERT_EQ(runCommand("cd " + shellQuote(dir) + " && HOME=" + shellQuote(dir) +
+                                 " timeout 300 soffice --headless --norestore --convert-to csv --outdir " +
+                                 shellQuote(dir + "/lo") + " " + shellQuote(path),
+                             &output),
+                  0)
+            << output;
+        EXPECT_EQ(readFile(dir + "/lo/names.csv").substr(0, 2), "10") << "LibreOffice computes SUM(Values)";
+    }
     if (haveProgram("ssconvert")) {
         std::string output;
         ASSERT_EQ(runCommand("timeout 120 ssconvert --recalc " + shellQuote(path) + " " + shellQuote(dir + "/g.csv"), &output), 0);

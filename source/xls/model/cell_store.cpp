@@ -7,7 +7,11 @@ namespace quire {
 uint32_t& CellStore::slot(int row, int col) {
     if (static_cast<size_t>(row) >= rows_.size()) rows_.resize(static_cast<size_t>(row) + 1);
     auto& cells = rows_[row];
-    if (static_cast<size_t>(col) >= cells.size()) cells.resize(static_cast<size_t>(col) + 1, 0);
+    if (static_cast<size_t>(col) >= cells.size()) {
+        // Rows usually fill left to right: start with room for a few columns at once.
+        if (cells.capacity() == 0) cells.reserve(16);
+        cells.resize(static_cast<size_t>(col) + 1, 0);
+    }
     return cells[col];
 }
 
