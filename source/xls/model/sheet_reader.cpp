@@ -6,6 +6,7 @@
 #include "field_cursor.h"
 #include "record_text.h"
 #include "sheet_impl.h"
+#include "sheet_record_types.h"
 #include "sheet_records.h"
 #include "xls/record_reader.h"
 #include "xls/strings.h"
@@ -13,23 +14,7 @@
 namespace quire {
 namespace {
 
-namespace Rec {
-constexpr uint16_t Bof = 0x0809, Eof = 0x000A, Index = 0x020B, DbCell = 0x00D7, Uncalced = 0x005E,
-                   CalcMode = 0x000D, CalcCount = 0x000C, CalcRefMode = 0x000F, CalcIter = 0x0011,
-                   CalcDelta = 0x0010, CalcSaveRecalc = 0x005F, PrintRowCol = 0x002A,
-                   PrintGrid = 0x002B, GridSet = 0x0082, Guts = 0x0080, DefaultRowHeight = 0x0225,
-                   WsBool = 0x0081, HorizontalPageBreaks = 0x001B, VerticalPageBreaks = 0x001A,
-                   Header = 0x0014, Footer = 0x0015, HCenter = 0x0083, VCenter = 0x0084,
-                   LeftMargin = 0x0026, RightMargin = 0x0027, TopMargin = 0x0028,
-                   BottomMargin = 0x0029, Pls = 0x004D, Setup = 0x00A1, Protect = 0x0012,
-                   Password = 0x0013, DefColWidth = 0x0055, ColInfo = 0x007D, StandardWidth = 0x0099,
-                   Dimensions = 0x0200, Row = 0x0208, Rk = 0x027E, Number = 0x0203, LabelSst = 0x00FD,
-                   Label = 0x0204, RString = 0x00D6, BoolErr = 0x0205, Blank = 0x0201, MulRk = 0x00BD,
-                   MulBlank = 0x00BE, Formula = 0x0006, String = 0x0207, SharedFmla = 0x04BC,
-                   Array = 0x0221, Table = 0x0236, Window2 = 0x023E, Scl = 0x00A0, Pane = 0x0041,
-                   Selection = 0x001D, MergeCells = 0x00E5, SheetExt = 0x0862, Continue = 0x003C,
-                   FormulaBiff3 = 0x0206, FormulaBiff4 = 0x0406;
-}  // namespace Rec
+namespace Rec = SheetRecord;
 
 void checkSize(bool ok, const char* name) {
     if (!ok) throw qrerror(std::string(name) + " size is incorrect");
@@ -44,13 +29,6 @@ double f64At(const uint8_t* p) {
     double v;
     std::memcpy(&v, p, 8);
     return v;
-}
-
-KeptRecord keep(const xls::Record& record) {
-    KeptRecord kept;
-    kept.id = record.type;
-    kept.data.assign(record.data, record.data + record.size);
-    return kept;
 }
 
 // Reads one substream's records into a sheet, tracking where unmodelled records stood.
@@ -74,7 +52,7 @@ private:
     }
     void keepRecord(const xls::Record& record) {
         lastList_ = &currentList();
-        lastList_->push_back(keep(record));
+        lastList_->push_back(keptCopy(record));
     }
     void keepEmbeddedSubstream(const xls::Record& bof);
     void readCell(const xls::Record& record);
@@ -102,7 +80,7 @@ void SheetReader::run() {
                 keepEmbeddedSubstream(record);
                 break;
             case Rec::Continue:
-                if (lastList_) lastList_->push_back(keep(record));
+                if (lastList_) lastList_->push_back(keptCopy(record));
                 break;
             case Rec::Rk: case Rec::Number: case Rec::LabelSst: case Rec::Label: case Rec::RString:
             case Rec::BoolErr: case Rec::Blank: case Rec::MulRk: case Rec::MulBlank:
@@ -133,13 +111,13 @@ void SheetReader::run() {
 void SheetReader::keepEmbeddedSubstream(const xls::Record& bof) {
     // A chart embedded in the sheet brings its own BOF..EOF; it is kept whole where it stood.
     std::vector<KeptRecord>& list = currentList();
-    list.push_back(keep(bof));
+    list.push_back(keptCopy(bof));
     int depth = 1;
     xls::Record record;
     while (depth > 0 && reader_.next(record)) {
         if (record.type == Rec::Bof) ++depth;
         if (record.type == Rec::Eof) --depth;
-        list.push_back(keep(record));
+        list.push_back(keptCopy(record));
     }
     if (depth > 0) throw qrerror("sheet EOF record not found");
     lastList_ = nullptr;
@@ -269,7 +247,7 @@ void SheetReader::readFormula(const xls::Record& r) {
             continue;
         }
         reader_.next(extra);
-        cell.shared.push_back(keep(extra));
+        cell.shared.push_back(keptCopy(extra));
     }
     if (!cellWanted(row, col)) return;
     lastList_ = nullptr;
@@ -376,7 +354,7 @@ void SheetReader::readSetting(const xls::Record& r) {
         case Rec::TopMargin: checkSize(n == 8, "Margin"); page.topMargin = f64At(d); break;
         case Rec::BottomMargin: checkSize(n == 8, "Margin"); page.bottomMargin = f64At(d); break;
         case Rec::Pls:
-            sheet_.printerSettings.push_back(keep(r));
+            sheet_.printerSettings.push_back(keptCopy(r));
             lastList_ = &sheet_.printerSettings;
             return;
         case Rec::Setup: {

@@ -7,26 +7,14 @@
 #include "field_cursor.h"
 #include "record_text.h"
 #include "sheet_impl.h"
+#include "sheet_record_types.h"
 #include "sheet_records.h"
 #include "xls/record_writer.h"
 
 namespace quire {
 namespace {
 
-namespace Rec {
-constexpr uint16_t Bof = 0x0809, Eof = 0x000A, Index = 0x020B, Uncalced = 0x005E, CalcMode = 0x000D,
-                   CalcCount = 0x000C, CalcRefMode = 0x000F, CalcIter = 0x0011, CalcDelta = 0x0010,
-                   CalcSaveRecalc = 0x005F, PrintRowCol = 0x002A, PrintGrid = 0x002B,
-                   GridSet = 0x0082, Guts = 0x0080, DefaultRowHeight = 0x0225, WsBool = 0x0081,
-                   HorizontalPageBreaks = 0x001B, VerticalPageBreaks = 0x001A, Header = 0x0014,
-                   Footer = 0x0015, HCenter = 0x0083, VCenter = 0x0084, LeftMargin = 0x0026,
-                   RightMargin = 0x0027, TopMargin = 0x0028, BottomMargin = 0x0029, Setup = 0x00A1,
-                   Protect = 0x0012, Password = 0x0013, DefColWidth = 0x0055, ColInfo = 0x007D,
-                   StandardWidth = 0x0099, Dimensions = 0x0200, Row = 0x0208, Rk = 0x027E,
-                   Number = 0x0203, LabelSst = 0x00FD, Label = 0x0204, BoolErr = 0x0205,
-                   Blank = 0x0201, Formula = 0x0006, String = 0x0207, Window2 = 0x023E, Scl = 0x00A0,
-                   Pane = 0x0041, Selection = 0x001D, MergeCells = 0x00E5, SheetExt = 0x0862;
-}  // namespace Rec
+namespace Rec = SheetRecord;
 
 constexpr size_t kMergesPerRecord = 1026;
 

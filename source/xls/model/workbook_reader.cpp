@@ -6,6 +6,7 @@
 #include "field_cursor.h"
 #include "record_text.h"
 #include "sheet_impl.h"
+#include "sheet_record_types.h"
 #include "sheet_records.h"
 #include "name_records.h"
 #include "style_records.h"
@@ -55,13 +56,6 @@ bool isVerbatim(uint16_t type) {
 // Records that follow a SupBook and belong to it.
 bool belongsToSupBook(uint16_t type) {
     return type == ExternName || type == 0x005A /* CRN */ || type == 0x0059 /* XCT */;
-}
-
-KeptRecord keep(const xls::Record& record) {
-    KeptRecord kept;
-    kept.id = record.type;
-    kept.data.assign(record.data, record.data + record.size);
-    return kept;
 }
 
 class GlobalsReader {
@@ -165,15 +159,15 @@ void GlobalsReader::dispatch(const xls::Record& r, const xls::RecordHeader&) {
         case Style: readStyleRecord(book_, r.data, r.size, biff5_); break;
         case StyleExt:
             if (book_.styles().empty()) throw qrerror("StyleExt: unexpected record");
-            book_.styles().back().extensions.push_back(keep(r));
+            book_.styles().back().extensions.push_back(keptCopy(r));
             keptIn = &book_.styles().back().extensions;
             break;
-        case XfExt: globals.xfExt.push_back(keep(r)); keptIn = &globals.xfExt; break;
+        case XfExt: globals.xfExt.push_back(keptCopy(r)); keptIn = &globals.xfExt; break;
         case Palette: readPaletteRecord(book_, r.data, r.size); break;
         case GlobalsRecord::BoundSheet8: readBoundSheet(r); break;
         case ExtSst: break;  // rebuilt with the string table
-        case MsoDrawingGroup: globals.drawingGroup.push_back(keep(r)); keptIn = &globals.drawingGroup; break;
-        case HfPicture: globals.hfPictures.push_back(keep(r)); keptIn = &globals.hfPictures; break;
+        case MsoDrawingGroup: globals.drawingGroup.push_back(keptCopy(r)); keptIn = &globals.drawingGroup; break;
+        case HfPicture: globals.hfPictures.push_back(keptCopy(r)); keptIn = &globals.hfPictures; break;
         case Template: book_.setTemplateFlag(true); break;
         case InterfaceEnd:
             if (r.size != 0 && r.size != 2) throw qrerror("InterfaceEnd size is incorrect");
@@ -182,7 +176,7 @@ void GlobalsReader::dispatch(const xls::Record& r, const xls::RecordHeader&) {
             if (r.size != 0) throw qrerror("Excel9File size is incorrect");
             break;
         case Continue:
-            if (lastList_) lastList_->push_back(keep(r));
+            if (lastList_) lastList_->push_back(keptCopy(r));
             return;
         case Lbl:
         case ExternSheet: {
@@ -195,18 +189,18 @@ void GlobalsReader::dispatch(const xls::Record& r, const xls::RecordHeader&) {
         case SupBook:
             if (biff5_) break;
             book_.supBooks().emplace_back();
-            book_.supBooks().back().records.push_back(keep(r));
+            book_.supBooks().back().records.push_back(keptCopy(r));
             keptIn = &book_.supBooks().back().records;
             break;
         default:
             if (belongsToSupBook(r.type) && !book_.supBooks().empty()) {
                 if (biff5_) break;
-                book_.supBooks().back().records.push_back(keep(r));
+                book_.supBooks().back().records.push_back(keptCopy(r));
                 keptIn = &book_.supBooks().back().records;
             } else if (isVerbatim(r.type)) {
                 auto& list = globals.verbatim[r.type];
                 list.clear();
-                list.push_back(keep(r));
+                list.push_back(keptCopy(r));
                 keptIn = &list;
             } else if (const SingleRecordSize* single = singleRecord(r.type)) {
                 if (single->size && r.size != single->size)
@@ -215,7 +209,7 @@ void GlobalsReader::dispatch(const xls::Record& r, const xls::RecordHeader&) {
                 if (r.type == Date1904) book_.setDate1904Flag((r.data[0] & 1) != 0);
                 if (r.type == Window1) book_.setActiveSheetIndex(r.data[10] | (r.data[11] << 8));
             } else {
-                globals.others.push_back(keep(r));
+                globals.others.push_back(keptCopy(r));
                 keptIn = &globals.others;
             }
             break;
@@ -230,7 +224,7 @@ void keepWholeSubstream(SheetImplT& sheet, xls::RecordReader& reader) {
     while (reader.next(record)) {
         if (record.type == Bof) ++depth;
         if (record.type == Eof) --depth;
-        sheet.rawSubstream.push_back(keep(record));
+        sheet.rawSubstream.push_back(keptCopy(record));
         if (depth == 0) return;
     }
     throw qrerror("sheet EOF record not found");
