@@ -254,10 +254,19 @@ const PropertyInfo& property(const ClassInfo& info, const std::string& name, boo
     throw std::invalid_argument("no property " + info.name + "." + name);
 }
 
+// Releases the arguments that were made for the call.
+void releaseTemporaries(std::vector<Host::Arg>& args) {
+    for (Host::Arg& a : args)
+        if (a.owned) Host::release(a.value);
+}
+
+void releaseTemporary(Host::Arg& arg) {
+    if (arg.owned) Host::release(arg.value);
+}
+
 }  // namespace
 
-Value Host::create(const std::string& className, std::vector<Value> values) {
-    std::vector<Arg> args(values.begin(), values.end());
+Value Host::create(const std::string& className, std::vector<Arg> args) {
     exceptionClass_.clear();
     exceptionMessage_.clear();
     Obj o = HostRuntime::newObject(className);
@@ -269,6 +278,7 @@ Value Host::create(const std::string& className, std::vector<Value> values) {
         const MethodInfo& m = pick(info, "Constructor", args, false);
         invoke(parse(m.declaration), m.function, o, args, nullptr, "");
     }
+    releaseTemporaries(args);
     return object(o);
 }
 
@@ -276,23 +286,29 @@ Value Host::call(const Value& self, const std::string& method, std::vector<Arg> 
     exceptionClass_.clear();
     exceptionMessage_.clear();
     const MethodInfo& m = pick(classOf(*this, self.o->className), method, args, false);
-    return invoke(parse(m.declaration), m.function, self.o, args, nullptr, "");
+    Value result = invoke(parse(m.declaration), m.function, self.o, args, nullptr, "");
+    releaseTemporaries(args);
+    return result;
 }
 
 Value Host::callShared(const std::string& className, const std::string& method, std::vector<Arg> args) {
     exceptionClass_.clear();
     exceptionMessage_.clear();
     const MethodInfo& m = pick(classOf(*this, className), method, args, true);
-    return invoke(parse(m.declaration), m.function, nullptr, args, nullptr, "");
+    Value result = invoke(parse(m.declaration), m.function, nullptr, args, nullptr, "");
+    releaseTemporaries(args);
+    return result;
 }
 
-void Host::assign(const Value& self, const std::string& method, std::vector<Arg> args, const Value& value) {
+void Host::assign(const Value& self, const std::string& method, std::vector<Arg> args, Arg value) {
     exceptionClass_.clear();
     exceptionMessage_.clear();
     const MethodInfo& m = pick(classOf(*this, self.o->className), method, args, false);
     if (!m.setter) throw std::invalid_argument(method + " is not assignable");
     Signature sig = parse(m.declaration);
-    invoke(sig, m.setter, self.o, args, &value, sig.returnType);
+    invoke(sig, m.setter, self.o, args, &value.value, sig.returnType);
+    releaseTemporaries(args);
+    releaseTemporary(value);
 }
 
 namespace {
@@ -318,21 +334,22 @@ Value Host::get(const Value& self, const std::string& name) {
     return resultOf(lower(p.type), p.getter, frame);
 }
 
-void Host::set(const Value& self, const std::string& name, const Value& value) {
+void Host::set(const Value& self, const std::string& name, Arg value) {
     exceptionClass_.clear();
     exceptionMessage_.clear();
     const PropertyInfo& p = property(classOf(*this, self.o->className), name, false);
     if (!p.setter) throw std::invalid_argument(name + " is read-only");
     if (p.setter == reinterpret_cast<void*>(-1)) {
-        int64_t raw = value.i;
+        int64_t raw = value.value.i;
         std::memcpy(static_cast<char*>(HostRuntime::data(self.o)) + p.param, &raw, sizeof raw);
         return;
     }
     Frame frame;
     frame.add(reinterpret_cast<int64_t>(self.o));
     frame.add(static_cast<int64_t>(p.param));
-    addValue(frame, lower(p.type), value);
+    addValue(frame, lower(p.type), value.value);
     invokeInt(p.setter, frame);
+    releaseTemporary(value);
 }
 
 Value Host::getShared(const std::string& className, const std::string& name) {
@@ -342,12 +359,13 @@ Value Host::getShared(const std::string& className, const std::string& name) {
     return resultOf(lower(p.type), p.getter, frame);
 }
 
-void Host::setShared(const std::string& className, const std::string& name, const Value& value) {
+void Host::setShared(const std::string& className, const std::string& name, Arg value) {
     const PropertyInfo& p = property(classOf(*this, className), name, true);
     Frame frame;
     frame.add(static_cast<int64_t>(p.param));
-    addValue(frame, lower(p.type), value);
+    addValue(frame, lower(p.type), value.value);
     invokeInt(p.setter, frame);
+    releaseTemporary(value);
 }
 
 }  // namespace testhost

@@ -62,7 +62,9 @@ RBBoolean setPropString(REALobject o, const char* name, REALstring value) {
     return 1;
 }
 RBBoolean setPropInteger(REALobject o, const char* name, RBInteger value) {
-    HostRuntime::state(reinterpret_cast<Obj>(o)).integers[name] = value;
+    BuiltinState& st = HostRuntime::state(reinterpret_cast<Obj>(o));
+    st.integers[name] = value;
+    st.integersSet.emplace_back(name);
     return 1;
 }
 RBBoolean getPropInteger(REALobject o, const char* name, RBInteger* value) {
@@ -356,6 +358,26 @@ void Host::clearDebugLines() {
 
 int Host::liveObjects() { return live; }
 
+void Host::setDateConstructors(bool withOffset, bool plain) {
+    config_.dateConstructorWithOffset = withOffset;
+    config_.dateConstructorPlain = plain;
+}
+
+void Host::setUtf16Marking(Utf16Marking marking) { config_.utf16Marking = marking; }
+
+Integer Host::constant(const std::string& className, const std::string& name) const {
+    const ClassInfo* info = findClass(className);
+    if (info)
+        for (const std::string& declaration : info->constants) {
+            if (declaration.compare(0, name.size() + 3, name + " = ") != 0) continue;
+            std::string value = declaration.substr(name.size() + 3);
+            if (value.size() > 2 && value[0] == '&' && (value[1] == 'H' || value[1] == 'h'))
+                return std::stoll(value.substr(2), nullptr, 16);
+            return std::stoll(value);
+        }
+    throw std::invalid_argument("no constant " + className + "." + name);
+}
+
 Value Host::folderItem(const std::string& path) {
     Obj item = HostRuntime::newObject("FolderItem");
     HostRuntime::state(item).path = path;
@@ -388,6 +410,11 @@ std::string Host::className(const Value& v) { return v.kind == Value::Object && 
 
 Integer Host::dateField(const Value& v, const std::string& field) {
     return v.kind == Value::Object && v.o ? HostRuntime::state(v.o).integers[field] : 0;
+}
+
+std::vector<std::string> Host::propertiesSet(const Value& v) {
+    if (v.kind != Value::Object || !v.o) return {};
+    return HostRuntime::state(v.o).integersSet;
 }
 
 std::string Host::memoryBlockBytes(const Value& v) {

@@ -24,6 +24,7 @@ struct ObjectRec {
 // State of the host's own classes, kept beside their objects.
 struct BuiltinState {
     std::map<std::string, Integer> integers;
+    std::vector<std::string> integersSet;  // names given to the property setter, in order
     Str message = nullptr;
     std::string path;
     std::vector<Obj> elements;

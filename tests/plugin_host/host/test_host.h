@@ -89,34 +89,45 @@ public:
     static Host& get();
 
     const Config& config() const { return config_; }
+    // Host behaviour that tests switch while the host runs; the version stays as started.
+    void setDateConstructors(bool withOffset, bool plain);
+    void setUtf16Marking(Utf16Marking marking);
     int pluginVersionCode() const { return pluginVersionCode_; }
     const std::vector<ClassInfo>& classes() const { return classes_; }
     const ClassInfo* findClass(const std::string& name) const;
     std::vector<std::string> debugLines() const;
     void clearDebugLines();
+    // The value of a registered class constant ("Name = 14", "Name = &H7F"); throws when absent.
+    Integer constant(const std::string& className, const std::string& name) const;
+
+    // An argument of a call. A value made in the argument list (text("x"), host().date(...)) is
+    // released when the call returns, as host code releases its temporaries; a value the caller
+    // holds (held.v, *cell) stays the caller's. Byref parameters take Ref arguments.
+    struct Arg {
+        Arg(Value&& v) : value(v), owned(true) {}
+        Arg(const Value& v) : value(v) {}
+        Arg(Ref r) : cell(std::move(r)) {}
+        Value value;
+        Ref cell;
+        bool owned = false;
+    };
 
     // Objects: New ClassName(args), a host FolderItem, Date or MemoryBlock.
-    Value create(const std::string& className, std::vector<Value> args = {});
+    Value create(const std::string& className, std::vector<Arg> args = {});
     Value folderItem(const std::string& path);
     Value date(int year, int month, int day, int hour = 0, int minute = 0, int second = 0);
     Value memoryBlock(const std::string& content);
 
     // Calls a method by its full declaration or by its name (the overload whose parameters fit the
-    // arguments). Byref parameters take Ref arguments.
-    struct Arg {
-        Arg(Value v) : value(std::move(v)) {}
-        Arg(Ref r) : cell(std::move(r)) {}
-        Value value;
-        Ref cell;
-    };
+    // arguments).
     Value call(const Value& self, const std::string& method, std::vector<Arg> args = {});
     Value callShared(const std::string& className, const std::string& method, std::vector<Arg> args = {});
     // Assigns through a method's setter: Method(args) = value.
-    void assign(const Value& self, const std::string& method, std::vector<Arg> args, const Value& value);
+    void assign(const Value& self, const std::string& method, std::vector<Arg> args, Arg value);
     Value get(const Value& self, const std::string& property);
-    void set(const Value& self, const std::string& property, const Value& value);
+    void set(const Value& self, const std::string& property, Arg value);
     Value getShared(const std::string& className, const std::string& property);
-    void setShared(const std::string& className, const std::string& property, const Value& value);
+    void setShared(const std::string& className, const std::string& property, Arg value);
 
     // The exception raised by the last call, if any: its class and message.
     bool raised() const { return !exceptionClass_.empty(); }
@@ -129,6 +140,8 @@ public:
     static uint32_t encoding(const Value& v);
     static std::string className(const Value& v);
     static Integer dateField(const Value& v, const std::string& field);
+    // The integer properties set on a host object through the property functions, in order.
+    static std::vector<std::string> propertiesSet(const Value& v);
     static std::string memoryBlockBytes(const Value& v);
     static std::vector<Value> arrayElements(const Value& v);
     static void release(Value& v);
