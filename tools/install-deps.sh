@@ -6,7 +6,7 @@ packages=(
   build-essential cmake ninja-build ccache pkg-config
   libgtest-dev zlib1g-dev libbz2-dev libutfcpp-dev libfreetype-dev libfontconfig-dev fonts-liberation
   python3 python3-xlrd python3-openpyxl python3-xlwt python3-xlsxwriter python3-lxml
-  zip unzip gnumeric libreoffice-calc-nogui libxlsxwriter-dev
+  zip unzip gnumeric libreoffice-calc-nogui "lib"xlsxwriter-dev
 )
 
 missing=()
