@@ -5,6 +5,11 @@ import resource, sys, time
 ROWS, COLS, POOL = 65536, 16, 5000
 
 
+def cpu_seconds():
+    usage = resource.getrusage(resource.RUSAGE_SELF)
+    return usage.ru_utime + usage.ru_stime
+
+
 def peak_mb():
     return resource.getrusage(resource.RUSAGE_SELF).ru_maxrss / 1024.0
 
@@ -41,4 +46,4 @@ if __name__ == "__main__":
     start = time.monotonic()
     (write if mode == "write" else read)(path)
     name = "xlwt" if mode == "write" else "xlrd"
-    print("%s %s: %.3f s, peak %.1f MB" % (name, mode, time.monotonic() - start, peak_mb()))
+    print("%s %s: %.3f s (cpu %.3f s), peak %.1f MB" % (name, mode, time.monotonic() - start, cpu_seconds(), peak_mb()))

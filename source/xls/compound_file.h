@@ -63,6 +63,8 @@ public:
     void open(const std::string& path);
     void open(const uint8_t* data, size_t size);
     void open(std::vector<uint8_t>&& bytes);
+    // Reads the caller's bytes in place: they must outlive every later read of this object.
+    void openView(const uint8_t* data, size_t size);
 
     // True when the file holds no workbook stream but an "EncryptionInfo"
     // stream (an encrypted package).
@@ -100,6 +102,7 @@ public:
     size_t close(uint8_t* buffer, size_t capacity) const;
 
 private:
+    void loadInput();
     void load();
     void readHeader();
     void loadDifat();
@@ -119,7 +122,9 @@ private:
     std::vector<size_t> rootLevelEntries() const;
 
     // Reading state.
-    std::vector<uint8_t> input_;
+    std::vector<uint8_t> ownedInput_;
+    const uint8_t* inputData_ = nullptr;
+    size_t inputSize_ = 0;
     CompoundFileHeader header_;
     uint32_t sectorSize_ = 512;
     uint32_t miniSectorSize_ = 64;

@@ -74,7 +74,22 @@ void Xls::open(const uint8_t* data, size_t size)
 
 void Xls::open(std::vector<uint8_t>&& bytes)
 {
-    input_ = std::move(bytes);
+    ownedInput_ = std::move(bytes);
+    inputData_ = ownedInput_.data();
+    inputSize_ = ownedInput_.size();
+    loadInput();
+}
+
+void Xls::openView(const uint8_t* data, size_t size)
+{
+    ownedInput_ = std::vector<uint8_t>();
+    inputData_ = data;
+    inputSize_ = data ? size : 0;
+    loadInput();
+}
+
+void Xls::loadInput()
+{
     header_ = CompoundFileHeader();
     difat_.clear();
     fat_.clear();
@@ -88,8 +103,9 @@ void Xls::open(std::vector<uint8_t>&& bytes)
         load();
     } catch (...) {
         // A failed open leaves nothing half-read behind.
-        input_.clear();
-        input_.shrink_to_fit();
+        ownedInput_ = std::vector<uint8_t>();
+        inputData_ = nullptr;
+        inputSize_ = 0;
         difat_.clear();
         fat_.clear();
         miniFat_.clear();
@@ -112,9 +128,9 @@ void Xls::load()
 
 void Xls::readHeader()
 {
-    if (input_.size() < CompoundFileHeader::Size)
+    if (inputSize_ < CompoundFileHeader::Size)
         throw qrerror("readHeader: file is corrupt (size < 512 bytes)");
-    header_ = CompoundFileHeader::parse(input_.data());
+    header_ = CompoundFileHeader::parse(inputData_);
     static const uint8_t signature[8] = {0xD0, 0xCF, 0x11, 0xE0, 0xA1, 0xB1, 0x1A, 0xE1};
     if (std::memcmp(header_.signature, signature, 8) != 0)
         throw qrerror("invalid file format");
@@ -130,13 +146,13 @@ void Xls::readHeader()
     // sector larger than a sector, cannot be laid out consistently.
     if (sectorSize_ < 128 || sectorSize_ > 65536 || miniSectorSize_ > sectorSize_)
         throw qrerror("invalid file format");
-    const uint64_t body = input_.size() - CompoundFileHeader::Size;
+    const uint64_t body = inputSize_ - CompoundFileHeader::Size;
     sectorsInInput_ = (body + sectorSize_ - 1) / sectorSize_;
 }
 
 bool Xls::wholeSectorInInput(uint32_t sector) const
 {
-    return sector < sectorsInInput_ && sectorOffset(sector) + sectorSize_ <= input_.size();
+    return sector < sectorsInInput_ && sectorOffset(sector) + sectorSize_ <= inputSize_;
 }
 
 void Xls::loadDifat()
@@ -151,16 +167,16 @@ void Xls::loadDifat()
             throw qrerror("Xls::loadDifat(): difat chain contains more sectors than _header.numDifatSectors (" +
                           numberText(header_.numDifatSectors) + ")");
         const uint64_t offset = sectorOffset(sector);
-        if (sector >= sectorsInInput_ || offset + uint64_t{entriesPerSector} * 4 > input_.size())
+        if (sector >= sectorsInInput_ || offset + uint64_t{entriesPerSector} * 4 > inputSize_)
             throw qrerror("loadDifat: file is corrupt [1]");
-        if (offset + sectorSize_ > input_.size())
+        if (offset + sectorSize_ > inputSize_)
             throw qrerror("loadDifat: file is corrupt [2]");
         if (visited.empty())
             visited.resize(sectorsInInput_);
         if (visited[sector])
             throw qrerror("Xls::loadDifat(): difat chain is cyclic");
         visited[sector] = true;
-        const uint8_t* p = input_.data() + offset;
+        const uint8_t* p = inputData_ + offset;
         for (uint32_t i = 0; i < entriesPerSector; ++i)
             difat_.push_back(loadU32(p + 4 * i));
         sector = loadU32(p + 4 * entriesPerSector);
@@ -192,7 +208,7 @@ void Xls::loadFat()
     fat_.resize(fatSectors.size() * size_t{entriesPerSector});
     size_t index = 0;
     for (uint32_t s : fatSectors) {
-        const uint8_t* p = input_.data() + sectorOffset(s);
+        const uint8_t* p = inputData_ + sectorOffset(s);
         for (uint32_t i = 0; i < entriesPerSector; ++i) {
             if (index >= fat_.size())
                 throw qrerror("Xls::loadFat(): index is out of range of _fat");
@@ -222,7 +238,7 @@ void Xls::loadMiniFat()
             throw qrerror("Xls::loadMiniFat(): file is corrupt");
         if (!wholeSectorInInput(sector))
             throw qrerror("loadMiniFat: file is corrupt");
-        const uint8_t* p = input_.data() + sectorOffset(sector);
+        const uint8_t* p = inputData_ + sectorOffset(sector);
         for (uint32_t i = 0; i < entriesPerSector; ++i)
             miniFat_.push_back(loadU32(p + 4 * i));
         ++sectorsRead;
@@ -249,7 +265,7 @@ void Xls::loadDir()
     const size_t entriesPerSector = sectorSize_ / DirEntry::Size;
     dir_.reserve(chain.size() * entriesPerSector);
     for (uint32_t s : chain) {
-        const uint8_t* p = input_.data() + sectorOffset(s);
+        const uint8_t* p = inputData_ + sectorOffset(s);
         for (size_t i = 0; i < entriesPerSector; ++i)
             dir_.push_back(DirEntry::parse(p + i * DirEntry::Size));
     }
@@ -292,7 +308,9 @@ std::vector<uint8_t> Xls::takeWorkbookStream()
     workbookStream();  // the same checks
     std::vector<uint8_t> stream = std::move(workbook_);
     workbook_ = std::vector<uint8_t>();
-    input_ = std::vector<uint8_t>();
+    ownedInput_ = std::vector<uint8_t>();
+    inputData_ = nullptr;
+    inputSize_ = 0;
     return stream;
 }
 
@@ -335,7 +353,7 @@ void Xls::readEntry(const DirEntry& entry, std::vector<uint8_t>& out, std::vecto
         throw qrerror("Xls::read(): stream is empty");
     const uint64_t declared = declaredStreamSize(entry);
     // A chain cannot hold more than the input; a larger declared size is a lie.
-    uint64_t remaining = std::min<uint64_t>(declared, input_.size());
+    uint64_t remaining = std::min<uint64_t>(declared, inputSize_);
     out.reserve(out.size() + remaining);
 
     // The cutoff is fixed at 4096 by the format, whatever the header says.
@@ -355,10 +373,10 @@ void Xls::readEntry(const DirEntry& entry, std::vector<uint8_t>& out, std::vecto
             if (position >= container.size())
                 break;  // the mini stream ends early: return what there is
             const uint64_t offset = sectorOffset(container[position]) + uint64_t{mini % perSector} * miniSectorSize_;
-            if (offset >= input_.size())
+            if (offset >= inputSize_)
                 break;
-            const uint64_t n = std::min<uint64_t>({remaining, miniSectorSize_, input_.size() - offset});
-            out.insert(out.end(), input_.begin() + offset, input_.begin() + offset + n);
+            const uint64_t n = std::min<uint64_t>({remaining, miniSectorSize_, inputSize_ - offset});
+            out.insert(out.end(), inputData_ + offset, inputData_ + offset + n);
             remaining -= n;
             mini = miniFat_[mini];
         }
@@ -375,10 +393,10 @@ void Xls::readEntry(const DirEntry& entry, std::vector<uint8_t>& out, std::vecto
             throw qrerror("Xls::read(): error in fat");
         usedSectors[sector] = true;
         const uint64_t offset = sectorOffset(sector);
-        if (offset >= input_.size())
+        if (offset >= inputSize_)
             break;  // truncated file: return what there is
-        const uint64_t n = std::min<uint64_t>({remaining, sectorSize_, input_.size() - offset});
-        out.insert(out.end(), input_.begin() + offset, input_.begin() + offset + n);
+        const uint64_t n = std::min<uint64_t>({remaining, sectorSize_, inputSize_ - offset});
+        out.insert(out.end(), inputData_ + offset, inputData_ + offset + n);
         remaining -= n;
         if (n < sectorSize_ && remaining > 0)
             break;

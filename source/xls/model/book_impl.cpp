@@ -1,10 +1,14 @@
 #include "book_impl.h"
 
+#include <fcntl.h>
+#include <sys/mman.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
 #include <algorithm>
 #include <cstdio>
 #include <cstdlib>
 #include <fstream>
-#include <iterator>
 
 #include "api/dates.h"
 #include "api/wide_text.h"
@@ -17,26 +21,54 @@
 namespace quire {
 namespace {
 
-std::vector<uint8_t> readWholeFile(const std::string& path, const char* failure) {
-    std::FILE* in = std::fopen(path.c_str(), "rb");
-    if (!in) throw qrerror(failure);
-    std::vector<uint8_t> bytes;
-    bool ok = std::fseek(in, 0, SEEK_END) == 0;
-    long size = ok ? std::ftell(in) : -1;
-    ok = ok && size >= 0 && std::fseek(in, 0, SEEK_SET) == 0;
-    if (ok) {
-        try {
-            bytes.resize(static_cast<size_t>(size));
-        } catch (...) {
-            std::fclose(in);
-            throw;
+// A file's bytes, mapped into memory when it can be (no copy), read otherwise.
+class FileBytes {
+public:
+    FileBytes(const std::string& path, const char* failure) {
+        int fd = ::open(path.c_str(), O_RDONLY | O_CLOEXEC);
+        if (fd < 0) throw qrerror(failure);
+        struct stat info {};
+        if (::fstat(fd, &info) != 0 || !S_ISREG(info.st_mode)) {
+            ::close(fd);
+            throw qrerror(failure);
         }
-        ok = std::fread(bytes.data(), 1, bytes.size(), in) == bytes.size();
+        size_ = static_cast<size_t>(info.st_size);
+        if (size_ > 0) {
+            void* mapped = ::mmap(nullptr, size_, PROT_READ, MAP_PRIVATE, fd, 0);
+            if (mapped != MAP_FAILED) {
+                mapped_ = static_cast<const uint8_t*>(mapped);
+            } else {
+                try {
+                    copy_.resize(size_);
+                } catch (...) {
+                    ::close(fd);
+                    throw;
+                }
+                size_t done = 0;
+                while (done < size_) {
+                    ssize_t got = ::read(fd, copy_.data() + done, size_ - done);
+                    if (got <= 0) break;
+                    done += static_cast<size_t>(got);
+                }
+                size_ = done;
+            }
+        }
+        ::close(fd);
     }
-    std::fclose(in);
-    if (!ok) throw qrerror(failure);
-    return bytes;
-}
+    ~FileBytes() {
+        if (mapped_) ::munmap(const_cast<uint8_t*>(mapped_), size_);
+    }
+    FileBytes(const FileBytes&) = delete;
+    FileBytes& operator=(const FileBytes&) = delete;
+
+    const uint8_t* data() const { return mapped_ ? mapped_ : copy_.data(); }
+    size_t size() const { return size_; }
+
+private:
+    const uint8_t* mapped_ = nullptr;
+    std::vector<uint8_t> copy_;
+    size_t size_ = 0;
+};
 
 }  // namespace
 
@@ -149,12 +181,12 @@ bool BookImplT::loadPartially(const wchar_t* fileName, int sheetIndex, int first
     bool loaded = message_.guard(false, [&] {
         resetToNew();
         if (!fileName) throw qrerror("file name name can't be 0");
-        std::vector<uint8_t> bytes = readWholeFile(narrowFileName(fileName), "can't open file for reading");
+        FileBytes bytes(narrowFileName(fileName), "can't open file for reading");
         LoadRequest request;
         request.sheetIndex = sheetIndex;
         request.firstRow = firstRow;
         request.lastRow = lastRow;
-        readWorkbook(*this, std::move(bytes), request);
+        readWorkbook(*this, bytes.data(), bytes.size(), request);
         return true;
     });
     if (!loaded) resetToNew();
@@ -165,10 +197,10 @@ bool BookImplT::loadInfo(const wchar_t* fileName) {
     bool loaded = message_.guard(false, [&] {
         resetToNew();
         if (!fileName) throw qrerror("file name name can't be 0");
-        std::vector<uint8_t> bytes = readWholeFile(narrowFileName(fileName), "can't open file for reading");
+        FileBytes bytes(narrowFileName(fileName), "can't open file for reading");
         LoadRequest request;
         request.infoOnly = true;
-        readWorkbook(*this, std::move(bytes), request);
+        readWorkbook(*this, bytes.data(), bytes.size(), request);
         return true;
     });
     if (!loaded) resetToNew();
@@ -180,8 +212,7 @@ bool BookImplT::loadRaw(const char* data, unsigned size, int, int, int) {
         resetToNew();
         LoadRequest request;
         request.skipBlanks = false;
-        const auto* bytes = reinterpret_cast<const uint8_t*>(data);
-        readWorkbook(*this, std::vector<uint8_t>(bytes, bytes + (data ? size : 0)), request);
+        readWorkbook(*this, reinterpret_cast<const uint8_t*>(data), data ? size : 0, request);
         return true;
     });
     if (!loaded) resetToNew();
@@ -580,8 +611,8 @@ int BookImplT::getPicture(int index, const char** data, unsigned* size) {
 int BookImplT::addPicture(const wchar_t* fileName) {
     return message_.guard(-1, [&] {
         if (!fileName) throw qrerror("file name can't be 0");
-        std::vector<uint8_t> bytes = readWholeFile(narrowFileName(fileName), "can't open file");
-        if (bytes.empty()) throw qrerror("picture is empty");
+        FileBytes bytes(narrowFileName(fileName), "can't open file");
+        if (bytes.size() == 0) throw qrerror("picture is empty");
         return addPicture2(reinterpret_cast<const char*>(bytes.data()), static_cast<unsigned>(bytes.size()));
     });
 }

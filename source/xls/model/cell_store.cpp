@@ -10,7 +10,8 @@ uint32_t& CellStore::slot(int row, int col) {
     if (static_cast<size_t>(col) >= cells.size()) {
         // Rows usually fill left to right: start with room for a few columns at once.
         if (cells.capacity() == 0) cells.reserve(16);
-        cells.resize(static_cast<size_t>(col) + 1, 0);
+        if (static_cast<size_t>(col) == cells.size()) cells.push_back(0);
+        else cells.resize(static_cast<size_t>(col) + 1, 0);
     }
     return cells[col];
 }
@@ -154,5 +155,15 @@ void CellStore::move(int fromRow, int fromCol, int toRow, int toCol) {
 }
 
 void CellStore::clear() { *this = CellStore(); }
+
+void CellStore::reserve(const Counts& counts) {
+    rks_.reserve(rks_.size() + counts.rk);
+    numbers_.reserve(numbers_.size() + counts.number);
+    labelSsts_.reserve(labelSsts_.size() + counts.labelSst);
+    blanks_.reserve(blanks_.size() + counts.blank);
+    boolErrs_.reserve(boolErrs_.size() + counts.boolErr);
+    labels_.reserve(labels_.size() + counts.label);
+    formulas_.reserve(formulas_.size() + counts.formula);
+}
 
 }  // namespace quire

@@ -98,6 +98,12 @@ public:
     void clear();
     size_t cellCount() const { return count_; }
 
+    // Room for this many records of each kind, so that loading does not grow the lists step by step.
+    struct Counts {
+        size_t rk = 0, number = 0, labelSst = 0, blank = 0, boolErr = 0, label = 0, formula = 0;
+    };
+    void reserve(const Counts& counts);
+
 private:
     uint32_t& slot(int row, int col);
     template <class Record>

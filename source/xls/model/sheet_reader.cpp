@@ -454,9 +454,43 @@ void SheetReader::readSetting(const xls::Record& r) {
     lastList_ = nullptr;
 }
 
+// Counts the cell records of the substream ahead, hopping from header to header.
+CellStore::Counts countCellRecords(const xls::RecordReader& reader) {
+    CellStore::Counts counts;
+    xls::RecordReader ahead = reader;
+    xls::Record record;
+    int depth = 0;
+    try {
+        while (ahead.next(record)) {
+            switch (record.type) {
+                case Rec::Bof: ++depth; break;
+                case Rec::Eof:
+                    if (--depth <= 0) return counts;
+                    break;
+                case Rec::Rk: ++counts.rk; break;
+                case Rec::MulRk: counts.rk += record.size / 6; break;
+                case Rec::Number: ++counts.number; break;
+                case Rec::LabelSst: ++counts.labelSst; break;
+                case Rec::Blank: ++counts.blank; break;
+                case Rec::MulBlank: counts.blank += record.size / 2; break;
+                case Rec::BoolErr: ++counts.boolErr; break;
+                case Rec::Label: case Rec::RString: ++counts.label; break;
+                case Rec::Formula: ++counts.formula; break;
+                default: break;
+            }
+        }
+    } catch (const qrerror&) {
+        // A damaged stream is reported by the reader proper.
+    }
+    return counts;
+}
+
 }  // namespace
 
 void readSheetSubstream(SheetImplT& sheet, xls::RecordReader& reader, const SheetReadOptions& options) {
+    CellStore::Counts counts = countCellRecords(reader);
+    if (options.skipBlanks) counts.blank = 0;
+    if (options.firstRow < 0 && options.endRow < 0) sheet.cells().reserve(counts);
     SheetReader(sheet, reader, options).run();
     sheet.invalidateUsedRange();
 }

@@ -16,7 +16,8 @@ struct LoadRequest {
 };
 
 // Reads a binary workbook (compound file bytes) into a book that was reset to new.
-void readWorkbook(BookImplT& book, std::vector<uint8_t> fileBytes, const LoadRequest& request);
+// The bytes are read in place and must stay valid for the call.
+void readWorkbook(BookImplT& book, const uint8_t* fileBytes, size_t size, const LoadRequest& request);
 
 // Serialises the book as a compound file holding its workbook stream.
 std::vector<uint8_t> writeWorkbook(BookImplT& book);

@@ -232,15 +232,15 @@ void keepWholeSubstream(SheetImplT& sheet, xls::RecordReader& reader) {
 
 }  // namespace
 
-void readWorkbook(BookImplT& book, std::vector<uint8_t> fileBytes, const LoadRequest& request) {
+void readWorkbook(BookImplT& book, const uint8_t* fileBytes, size_t size, const LoadRequest& request) {
     // A bare record stream without a compound file is an old (BIFF2 to BIFF4) workbook.
-    if (fileBytes.size() >= 4 && fileBytes[0] == 0x09 &&
+    if (size >= 4 && fileBytes[0] == 0x09 &&
         (fileBytes[1] == 0x00 || fileBytes[1] == 0x02 || fileBytes[1] == 0x04 || fileBytes[1] == 0x08))
         throw qrerror("This file format isn't supported");
     std::vector<uint8_t> stream;
     {
         xls::Xls container;
-        container.open(std::move(fileBytes));
+        container.openView(fileBytes, size);
         stream = container.takeWorkbookStream();
     }
     xls::RecordReader reader(stream);
