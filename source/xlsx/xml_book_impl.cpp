@@ -258,6 +258,8 @@ ISheetT<TCHAR>* XMLBookImplT<TCHAR, Tag>::insertSheet(int index, const TCHAR* na
             ws.unset_oleObjects();
             ws.unset_controls();
             ws.unset_hyperlinks();
+            // Printer settings are a part of the source sheet as well.
+            if (auto* pageSetup = ws.find_pageSetup()) pageSetup->unset_id();
         } else {
             if (initSheet) throw qrerror("sheet of another kind of book can't be copied yet");
             part->makeEmpty();

@@ -1,6 +1,7 @@
 #include "xlsx/xml_book_proxy.h"
 
 #include <cstring>
+#include <string>
 
 #include "api/handles.h"
 #include "xlsx/xml_book_impl.h"
@@ -11,6 +12,13 @@ namespace {
 IBookT<wchar_t>* makeFlavour(bool strict) {
     if (strict) return new XMLBookImplT<wchar_t, excelStrict_tag>();
     return new XMLBookImplT<wchar_t, excelNormal_tag>();
+}
+
+// A book of the other flavour fails on the workbook's document element: its namespace is not
+// the one that flavour binds.
+bool stoppedAtWorkbookRoot(const char* message) {
+    const std::string text = message ? message : "";
+    return text.rfind("Element not found in ", 0) == 0 && text.find(" (workbook) ") != std::string::npos;
 }
 
 }  // namespace
@@ -29,10 +37,17 @@ bool XMLBookProxy::retry(Load&& load) {
     } catch (...) {
         return false;  // the first book and its message stay
     }
+    const bool loaded = load(*other);
+    // When both fail, the message worth keeping is the one of the flavour that got past the
+    // workbook's document element: the other one only says that its namespace is not there.
+    if (!loaded && (!stoppedAtWorkbookRoot(book_->errorMessage()) || stoppedAtWorkbookRoot(other->errorMessage()))) {
+        delete other;
+        return false;
+    }
     delete book_;
     book_ = other;
     strict_ = !strict_;
-    return load(*book_);
+    return loaded;
 }
 
 bool XMLBookProxy::load(const wchar_t* fileName, const wchar_t* tempFile) {

@@ -528,7 +528,9 @@ class Emitter:
                 ranks.append(index)
             else:
                 ranks.append(next(i for i, t in enumerate(info.slots) if t.ordered_set == s.ordered_set))
-        out.append("    std::size_t known = 0;\n    [[maybe_unused]] int rank = -1;\n")
+        out.append("    std::size_t known = 0;\n")
+        if info.slots:
+            out.append("    int rank = -1;\n")
         if limited and info.row_limits:
             out.append("    std::int64_t row_number = 0;\n    c_CT_Row* worker = handler ? new c_CT_Row() : nullptr;\n"
                        "    const quire::ooxml::c_owned<c_CT_Row> worker_owner = [&] {\n"
@@ -637,8 +639,9 @@ class Emitter:
         out.append("    if (m_foreign_) m_foreign_->write_attributes(writer);\n")
         if info.simple_content is not None:
             out.append("    %s\n" % self.text_write(info.simple_content, "m_value"))
-        if info.slots:
-            out.append("    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;\n")
+        # Only complex children hand back a result from their own marshal.
+        if any(s.kind == "complex" for s in info.slots):
+            out.append("    lmx::elmx_error result = lmx::ELMX_OK;\n")
         out.append("    c_foreign_cursor cursor(m_foreign_.get(), writer);\n")
         done_sets = set()
         for index, s in enumerate(info.slots):

@@ -527,7 +527,7 @@ lmx::elmx_error c_CT_AbsoluteAnchor::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -638,7 +638,7 @@ lmx::elmx_error c_CT_AbsoluteAnchor::marshal(lmx::c_xml_writer& writer, const ch
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_pos) {
         cursor.next_known();
@@ -719,7 +719,6 @@ lmx::elmx_error c_CT_AdjPoint2D::unmarshal(lmx::c_xml_reader& reader, const std:
     if (!m_has_x) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "x", __LINE__);
     if (!m_has_y) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "y", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -771,7 +770,7 @@ lmx::elmx_error c_CT_AdjustHandleList::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -822,7 +821,7 @@ lmx::elmx_error c_CT_AdjustHandleList::marshal(lmx::c_xml_writer& writer, const 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -885,7 +884,6 @@ lmx::elmx_error c_CT_AlphaBiLevelEffect::unmarshal(lmx::c_xml_reader& reader, co
     }
     if (!m_has_thresh) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "thresh", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -936,7 +934,6 @@ lmx::elmx_error c_CT_AlphaCeilingEffect::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -986,7 +983,6 @@ lmx::elmx_error c_CT_AlphaFloorEffect::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1036,7 +1032,7 @@ lmx::elmx_error c_CT_AlphaInverseEffect::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1117,7 +1113,7 @@ lmx::elmx_error c_CT_AlphaInverseEffect::marshal(lmx::c_xml_writer& writer, cons
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_scrgbClr) {
         cursor.next_known();
@@ -1171,7 +1167,7 @@ lmx::elmx_error c_CT_AlphaModulateEffect::unmarshal(lmx::c_xml_reader& reader, c
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1214,7 +1210,7 @@ lmx::elmx_error c_CT_AlphaModulateEffect::marshal(lmx::c_xml_writer& writer, con
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_cont) {
         cursor.next_known();
@@ -1248,7 +1244,6 @@ lmx::elmx_error c_CT_AlphaModulateFixedEffect::unmarshal(lmx::c_xml_reader& read
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1304,7 +1299,6 @@ lmx::elmx_error c_CT_AlphaOutsetEffect::unmarshal(lmx::c_xml_reader& reader, con
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1361,7 +1355,6 @@ lmx::elmx_error c_CT_AlphaReplaceEffect::unmarshal(lmx::c_xml_reader& reader, co
     }
     if (!m_has_a) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "a", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1422,7 +1415,6 @@ lmx::elmx_error c_CT_AnchorClientData::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1480,7 +1472,6 @@ lmx::elmx_error c_CT_Angle::unmarshal(lmx::c_xml_reader& reader, const std::stri
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1531,7 +1522,7 @@ lmx::elmx_error c_CT_Backdrop::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1602,7 +1593,7 @@ lmx::elmx_error c_CT_Backdrop::marshal(lmx::c_xml_writer& writer, const char* na
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_anchor) {
         cursor.next_known();
@@ -1661,7 +1652,6 @@ lmx::elmx_error c_CT_Bevel::unmarshal(lmx::c_xml_reader& reader, const std::stri
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1720,7 +1710,6 @@ lmx::elmx_error c_CT_BiLevelEffect::unmarshal(lmx::c_xml_reader& reader, const s
     }
     if (!m_has_thresh) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "thresh", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1777,7 +1766,7 @@ lmx::elmx_error c_CT_BlendEffect::unmarshal(lmx::c_xml_reader& reader, const std
     }
     if (!m_has_blend) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "blend", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1821,7 +1810,7 @@ lmx::elmx_error c_CT_BlendEffect::marshal(lmx::c_xml_writer& writer, const char*
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     writer.attribute("blend", std::string_view(enum_text(k_enum_ST_BlendMode, 5, m_blend)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_cont) {
         cursor.next_known();
@@ -1865,7 +1854,7 @@ lmx::elmx_error c_CT_Blip::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2062,7 +2051,7 @@ lmx::elmx_error c_CT_Blip::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (m_has_link) put_attribute(writer, "r:link", m_link);
     if (m_has_cstate) writer.attribute("cstate", std::string_view(enum_text(k_enum_ST_BlipCompression, 5, m_cstate)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -2329,7 +2318,7 @@ lmx::elmx_error c_CT_BlipFillProperties::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2396,7 +2385,7 @@ lmx::elmx_error c_CT_BlipFillProperties::marshal(lmx::c_xml_writer& writer, cons
     if (m_has_dpi) put_integer_attribute(writer, "dpi", m_dpi);
     if (m_has_rotWithShape) put_attribute(writer, "rotWithShape", m_rotWithShape);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_blip) {
         cursor.next_known();
@@ -2450,7 +2439,6 @@ lmx::elmx_error c_CT_BlurEffect::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2507,7 +2495,6 @@ lmx::elmx_error c_CT_Boolean::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2574,7 +2561,7 @@ lmx::elmx_error c_CT_Camera::unmarshal(lmx::c_xml_reader& reader, const std::str
     }
     if (!m_has_prst) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "prst", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2618,7 +2605,7 @@ lmx::elmx_error c_CT_Camera::marshal(lmx::c_xml_writer& writer, const char* name
     if (m_has_fov) put_integer_attribute(writer, "fov", m_fov);
     if (m_has_zoom) put_attribute(writer, "zoom", m_zoom);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_rot) {
         cursor.next_known();
@@ -2647,7 +2634,7 @@ lmx::elmx_error c_CT_Color::unmarshal(lmx::c_xml_reader& reader, const std::stri
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2728,7 +2715,7 @@ lmx::elmx_error c_CT_Color::marshal(lmx::c_xml_writer& writer, const char* name)
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_scrgbClr) {
         cursor.next_known();
@@ -2787,7 +2774,7 @@ lmx::elmx_error c_CT_ColorChangeEffect::unmarshal(lmx::c_xml_reader& reader, con
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2841,7 +2828,7 @@ lmx::elmx_error c_CT_ColorChangeEffect::marshal(lmx::c_xml_writer& writer, const
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_useA) put_attribute(writer, "useA", m_useA);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_clrFrom) {
         cursor.next_known();
@@ -2875,7 +2862,7 @@ lmx::elmx_error c_CT_ColorReplaceEffect::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2956,7 +2943,7 @@ lmx::elmx_error c_CT_ColorReplaceEffect::marshal(lmx::c_xml_writer& writer, cons
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_scrgbClr) {
         cursor.next_known();
@@ -3010,7 +2997,6 @@ lmx::elmx_error c_CT_ComplementTransform::unmarshal(lmx::c_xml_reader& reader, c
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3072,7 +3058,6 @@ lmx::elmx_error c_CT_Connection::unmarshal(lmx::c_xml_reader& reader, const std:
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     if (!m_has_idx) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "idx", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3130,7 +3115,7 @@ lmx::elmx_error c_CT_ConnectionSite::unmarshal(lmx::c_xml_reader& reader, const 
     }
     if (!m_has_ang) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ang", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3174,7 +3159,7 @@ lmx::elmx_error c_CT_ConnectionSite::marshal(lmx::c_xml_writer& writer, const ch
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     put_attribute(writer, "ang", m_ang);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_pos) {
         cursor.next_known();
@@ -3203,7 +3188,7 @@ lmx::elmx_error c_CT_ConnectionSiteList::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3244,7 +3229,7 @@ lmx::elmx_error c_CT_ConnectionSiteList::marshal(lmx::c_xml_writer& writer, cons
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cxn) {
         cursor.next_known();
@@ -3283,7 +3268,7 @@ lmx::elmx_error c_CT_Connector::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3346,7 +3331,7 @@ lmx::elmx_error c_CT_Connector::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_macro) put_attribute(writer, "macro", m_macro);
     if (m_has_fPublished) put_attribute(writer, "fPublished", m_fPublished);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_nvCxnSpPr) {
         cursor.next_known();
@@ -3435,7 +3420,7 @@ lmx::elmx_error c_CT_ConnectorLocking::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3486,7 +3471,7 @@ lmx::elmx_error c_CT_ConnectorLocking::marshal(lmx::c_xml_writer& writer, const 
     if (m_has_noChangeArrowheads) put_attribute(writer, "noChangeArrowheads", m_noChangeArrowheads);
     if (m_has_noChangeShapeType) put_attribute(writer, "noChangeShapeType", m_noChangeShapeType);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_extLst) {
         cursor.next_known();
@@ -3515,7 +3500,7 @@ lmx::elmx_error c_CT_ConnectorNonVisual::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3568,7 +3553,7 @@ lmx::elmx_error c_CT_ConnectorNonVisual::marshal(lmx::c_xml_writer& writer, cons
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_cNvPr) {
         cursor.next_known();
@@ -3602,7 +3587,7 @@ lmx::elmx_error c_CT_CustomGeometry2D::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3685,7 +3670,7 @@ lmx::elmx_error c_CT_CustomGeometry2D::marshal(lmx::c_xml_writer& writer, const 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_avLst) {
         cursor.next_known();
@@ -3751,7 +3736,6 @@ lmx::elmx_error c_CT_DashStop::unmarshal(lmx::c_xml_reader& reader, const std::s
     if (!m_has_d) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "d", __LINE__);
     if (!m_has_sp) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sp", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3803,7 +3787,7 @@ lmx::elmx_error c_CT_DashStopList::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3844,7 +3828,7 @@ lmx::elmx_error c_CT_DashStopList::marshal(lmx::c_xml_writer& writer, const char
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_ds) {
         cursor.next_known();
@@ -3877,7 +3861,7 @@ lmx::elmx_error c_CT_Drawing::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3937,7 +3921,7 @@ lmx::elmx_error c_CT_Drawing::marshal(lmx::c_xml_writer& writer, const char* nam
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -4007,7 +3991,7 @@ lmx::elmx_error c_CT_DuotoneEffect::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4094,7 +4078,7 @@ lmx::elmx_error c_CT_DuotoneEffect::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -4213,7 +4197,7 @@ lmx::elmx_error c_CT_EffectContainer::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4518,7 +4502,7 @@ lmx::elmx_error c_CT_EffectContainer::marshal(lmx::c_xml_writer& writer, const c
     if (m_has_type) writer.attribute("type", std::string_view(enum_text(k_enum_ST_EffectContainerType, 2, m_type)));
     if (m_has_name) put_attribute(writer, "name", m_name);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -4939,7 +4923,7 @@ lmx::elmx_error c_CT_EffectList::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5036,7 +5020,7 @@ lmx::elmx_error c_CT_EffectList::marshal(lmx::c_xml_writer& writer, const char* 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_blur) {
         cursor.next_known();
@@ -5106,7 +5090,6 @@ lmx::elmx_error c_CT_EffectReference::unmarshal(lmx::c_xml_reader& reader, const
     }
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5168,7 +5151,6 @@ lmx::elmx_error c_CT_EmbeddedWAVAudioFile::unmarshal(lmx::c_xml_reader& reader, 
     }
     if (!m_has_embed) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "embed", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5220,7 +5202,7 @@ lmx::elmx_error c_CT_FillEffect::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5301,7 +5283,7 @@ lmx::elmx_error c_CT_FillEffect::marshal(lmx::c_xml_writer& writer, const char* 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_noFill) {
         cursor.next_known();
@@ -5361,7 +5343,7 @@ lmx::elmx_error c_CT_FillOverlayEffect::unmarshal(lmx::c_xml_reader& reader, con
     }
     if (!m_has_blend) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "blend", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5443,7 +5425,7 @@ lmx::elmx_error c_CT_FillOverlayEffect::marshal(lmx::c_xml_writer& writer, const
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     writer.attribute("blend", std::string_view(enum_text(k_enum_ST_BlendMode, 5, m_blend)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_noFill) {
         cursor.next_known();
@@ -5503,7 +5485,6 @@ lmx::elmx_error c_CT_FixedPercentage::unmarshal(lmx::c_xml_reader& reader, const
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5559,7 +5540,6 @@ lmx::elmx_error c_CT_FlatText::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5616,7 +5596,7 @@ lmx::elmx_error c_CT_FontReference::unmarshal(lmx::c_xml_reader& reader, const s
     }
     if (!m_has_idx) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "idx", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5698,7 +5678,7 @@ lmx::elmx_error c_CT_FontReference::marshal(lmx::c_xml_writer& writer, const cha
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     writer.attribute("idx", std::string_view(enum_text(k_enum_ST_FontCollectionIndex, 3, m_idx)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_scrgbClr) {
         cursor.next_known();
@@ -5752,7 +5732,6 @@ lmx::elmx_error c_CT_GammaTransform::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5814,7 +5793,6 @@ lmx::elmx_error c_CT_GeomGuide::unmarshal(lmx::c_xml_reader& reader, const std::
     if (!m_has_name) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "name", __LINE__);
     if (!m_has_fmla) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "fmla", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5866,7 +5844,7 @@ lmx::elmx_error c_CT_GeomGuideList::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5907,7 +5885,7 @@ lmx::elmx_error c_CT_GeomGuideList::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_gd) {
         cursor.next_known();
@@ -5960,7 +5938,6 @@ lmx::elmx_error c_CT_GeomRect::unmarshal(lmx::c_xml_reader& reader, const std::s
     if (!m_has_r) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "r", __LINE__);
     if (!m_has_b) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "b", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6019,7 +5996,7 @@ lmx::elmx_error c_CT_GlowEffect::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6101,7 +6078,7 @@ lmx::elmx_error c_CT_GlowEffect::marshal(lmx::c_xml_writer& writer, const char* 
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_rad) put_integer_attribute(writer, "rad", m_rad);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_scrgbClr) {
         cursor.next_known();
@@ -6165,7 +6142,7 @@ lmx::elmx_error c_CT_GradientFillProperties::unmarshal(lmx::c_xml_reader& reader
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6232,7 +6209,7 @@ lmx::elmx_error c_CT_GradientFillProperties::marshal(lmx::c_xml_writer& writer, 
     if (m_has_flip) writer.attribute("flip", std::string_view(enum_text(k_enum_ST_TileFlipMode, 4, m_flip)));
     if (m_has_rotWithShape) put_attribute(writer, "rotWithShape", m_rotWithShape);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_gsLst) {
         cursor.next_known();
@@ -6282,7 +6259,7 @@ lmx::elmx_error c_CT_GradientStop::unmarshal(lmx::c_xml_reader& reader, const st
     }
     if (!m_has_pos) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "pos", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6364,7 +6341,7 @@ lmx::elmx_error c_CT_GradientStop::marshal(lmx::c_xml_writer& writer, const char
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     put_attribute(writer, "pos", m_pos);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_scrgbClr) {
         cursor.next_known();
@@ -6418,7 +6395,7 @@ lmx::elmx_error c_CT_GradientStopList::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6461,7 +6438,7 @@ lmx::elmx_error c_CT_GradientStopList::marshal(lmx::c_xml_writer& writer, const 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_gs) {
         cursor.next_known();
@@ -6490,7 +6467,7 @@ lmx::elmx_error c_CT_GraphicalObject::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6533,7 +6510,7 @@ lmx::elmx_error c_CT_GraphicalObject::marshal(lmx::c_xml_writer& writer, const c
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_graphicData) {
         cursor.next_known();
@@ -6568,7 +6545,6 @@ lmx::elmx_error c_CT_GraphicalObjectData::unmarshal(lmx::c_xml_reader& reader, c
     }
     if (!m_has_uri) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "uri", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6629,7 +6605,7 @@ lmx::elmx_error c_CT_GraphicalObjectFrame::unmarshal(lmx::c_xml_reader& reader, 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6694,7 +6670,7 @@ lmx::elmx_error c_CT_GraphicalObjectFrame::marshal(lmx::c_xml_writer& writer, co
     if (m_has_macro) put_attribute(writer, "macro", m_macro);
     if (m_has_fPublished) put_attribute(writer, "fPublished", m_fPublished);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_nvGraphicFramePr) {
         cursor.next_known();
@@ -6763,7 +6739,7 @@ lmx::elmx_error c_CT_GraphicalObjectFrameLocking::unmarshal(lmx::c_xml_reader& r
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6810,7 +6786,7 @@ lmx::elmx_error c_CT_GraphicalObjectFrameLocking::marshal(lmx::c_xml_writer& wri
     if (m_has_noMove) put_attribute(writer, "noMove", m_noMove);
     if (m_has_noResize) put_attribute(writer, "noResize", m_noResize);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_extLst) {
         cursor.next_known();
@@ -6839,7 +6815,7 @@ lmx::elmx_error c_CT_GraphicalObjectFrameNonVisual::unmarshal(lmx::c_xml_reader&
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6892,7 +6868,7 @@ lmx::elmx_error c_CT_GraphicalObjectFrameNonVisual::marshal(lmx::c_xml_writer& w
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_cNvPr) {
         cursor.next_known();

@@ -49,7 +49,7 @@ lmx::elmx_error c_CT_PresetTextShape::unmarshal(lmx::c_xml_reader& reader, const
     }
     if (!m_has_prst) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "prst", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -91,7 +91,7 @@ lmx::elmx_error c_CT_PresetTextShape::marshal(lmx::c_xml_writer& writer, const c
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     writer.attribute("prst", std::string_view(enum_text(k_enum_ST_TextShapeType, 41, m_prst)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_avLst) {
         cursor.next_known();
@@ -190,7 +190,6 @@ lmx::elmx_error c_CT_ReflectionEffect::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -254,7 +253,7 @@ lmx::elmx_error c_CT_RegularTextRun::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -312,7 +311,7 @@ lmx::elmx_error c_CT_RegularTextRun::marshal(lmx::c_xml_writer& writer, const ch
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_rPr) {
         cursor.next_known();
@@ -353,7 +352,6 @@ lmx::elmx_error c_CT_Rel::unmarshal(lmx::c_xml_reader& reader, const std::string
     }
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -414,7 +412,6 @@ lmx::elmx_error c_CT_RelativeOffsetEffect::unmarshal(lmx::c_xml_reader& reader, 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -486,7 +483,6 @@ lmx::elmx_error c_CT_RelativeRect::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -546,7 +542,7 @@ lmx::elmx_error c_CT_SRgbColor::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -832,7 +828,7 @@ lmx::elmx_error c_CT_SRgbColor::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     writer.attribute("val", std::string_view(m_val.to_hex()));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -1245,7 +1241,7 @@ lmx::elmx_error c_CT_ScRgbColor::unmarshal(lmx::c_xml_reader& reader, const std:
     if (!m_has_g) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "g", __LINE__);
     if (!m_has_b) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "b", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1533,7 +1529,7 @@ lmx::elmx_error c_CT_ScRgbColor::marshal(lmx::c_xml_writer& writer, const char* 
     put_attribute(writer, "g", m_g);
     put_attribute(writer, "b", m_b);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -1928,7 +1924,7 @@ lmx::elmx_error c_CT_Scene3D::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1997,7 +1993,7 @@ lmx::elmx_error c_CT_Scene3D::marshal(lmx::c_xml_writer& writer, const char* nam
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_camera) {
         cursor.next_known();
@@ -2047,7 +2043,7 @@ lmx::elmx_error c_CT_SchemeColor::unmarshal(lmx::c_xml_reader& reader, const std
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2333,7 +2329,7 @@ lmx::elmx_error c_CT_SchemeColor::marshal(lmx::c_xml_writer& writer, const char*
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     writer.attribute("val", std::string_view(enum_text(k_enum_ST_SchemeColorVal, 17, m_val)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -2748,7 +2744,7 @@ lmx::elmx_error c_CT_Shape::unmarshal(lmx::c_xml_reader& reader, const std::stri
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2821,7 +2817,7 @@ lmx::elmx_error c_CT_Shape::marshal(lmx::c_xml_writer& writer, const char* name)
     if (m_has_fLocksText) put_attribute(writer, "fLocksText", m_fLocksText);
     if (m_has_fPublished) put_attribute(writer, "fPublished", m_fPublished);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_nvSpPr) {
         cursor.next_known();
@@ -2885,7 +2881,7 @@ lmx::elmx_error c_CT_Shape3D::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2962,7 +2958,7 @@ lmx::elmx_error c_CT_Shape3D::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_has_contourW) put_integer_attribute(writer, "contourW", m_contourW);
     if (m_has_prstMaterial) writer.attribute("prstMaterial", std::string_view(enum_text(k_enum_ST_PresetMaterialType, 15, m_prstMaterial)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_bevelT) {
         cursor.next_known();
@@ -3066,7 +3062,7 @@ lmx::elmx_error c_CT_ShapeLocking::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3118,7 +3114,7 @@ lmx::elmx_error c_CT_ShapeLocking::marshal(lmx::c_xml_writer& writer, const char
     if (m_has_noChangeShapeType) put_attribute(writer, "noChangeShapeType", m_noChangeShapeType);
     if (m_has_noTextEdit) put_attribute(writer, "noTextEdit", m_noTextEdit);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_extLst) {
         cursor.next_known();
@@ -3147,7 +3143,7 @@ lmx::elmx_error c_CT_ShapeNonVisual::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3200,7 +3196,7 @@ lmx::elmx_error c_CT_ShapeNonVisual::marshal(lmx::c_xml_writer& writer, const ch
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_cNvPr) {
         cursor.next_known();
@@ -3239,7 +3235,7 @@ lmx::elmx_error c_CT_ShapeProperties::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3393,7 +3389,7 @@ lmx::elmx_error c_CT_ShapeProperties::marshal(lmx::c_xml_writer& writer, const c
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_bwMode) writer.attribute("bwMode", std::string_view(enum_text(k_enum_ST_BlackWhiteMode, 11, m_bwMode)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_xfrm) {
         cursor.next_known();
@@ -3492,7 +3488,7 @@ lmx::elmx_error c_CT_ShapeStyle::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3565,7 +3561,7 @@ lmx::elmx_error c_CT_ShapeStyle::marshal(lmx::c_xml_writer& writer, const char* 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_lnRef) {
         cursor.next_known();
@@ -3615,7 +3611,6 @@ lmx::elmx_error c_CT_SoftEdgesEffect::unmarshal(lmx::c_xml_reader& reader, const
     }
     if (!m_has_rad) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "rad", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3666,7 +3661,7 @@ lmx::elmx_error c_CT_SolidColorFillProperties::unmarshal(lmx::c_xml_reader& read
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3747,7 +3742,7 @@ lmx::elmx_error c_CT_SolidColorFillProperties::marshal(lmx::c_xml_writer& writer
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_scrgbClr) {
         cursor.next_known();
@@ -3819,7 +3814,6 @@ lmx::elmx_error c_CT_SphereCoords::unmarshal(lmx::c_xml_reader& reader, const st
     if (!m_has_lon) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "lon", __LINE__);
     if (!m_has_rev) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "rev", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3872,7 +3866,7 @@ lmx::elmx_error c_CT_StretchInfoProperties::unmarshal(lmx::c_xml_reader& reader,
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3913,7 +3907,7 @@ lmx::elmx_error c_CT_StretchInfoProperties::marshal(lmx::c_xml_writer& writer, c
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_fillRect) {
         cursor.next_known();
@@ -3948,7 +3942,7 @@ lmx::elmx_error c_CT_StyleMatrixReference::unmarshal(lmx::c_xml_reader& reader, 
     }
     if (!m_has_idx) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "idx", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4030,7 +4024,7 @@ lmx::elmx_error c_CT_StyleMatrixReference::marshal(lmx::c_xml_writer& writer, co
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     put_integer_attribute(writer, "idx", m_idx);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_scrgbClr) {
         cursor.next_known();
@@ -4095,7 +4089,7 @@ lmx::elmx_error c_CT_SystemColor::unmarshal(lmx::c_xml_reader& reader, const std
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4382,7 +4376,7 @@ lmx::elmx_error c_CT_SystemColor::marshal(lmx::c_xml_writer& writer, const char*
     writer.attribute("val", std::string_view(enum_text(k_enum_ST_SystemColorVal, 30, m_val)));
     if (m_has_lastClr) writer.attribute("lastClr", std::string_view(m_lastClr.to_hex()));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -4788,7 +4782,6 @@ lmx::elmx_error c_CT_TextAutonumberBullet::unmarshal(lmx::c_xml_reader& reader, 
     }
     if (!m_has_type) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "type", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4840,7 +4833,7 @@ lmx::elmx_error c_CT_TextBlipBullet::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4883,7 +4876,7 @@ lmx::elmx_error c_CT_TextBlipBullet::marshal(lmx::c_xml_writer& writer, const ch
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_blip) {
         cursor.next_known();
@@ -4912,7 +4905,7 @@ lmx::elmx_error c_CT_TextBody::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4973,7 +4966,7 @@ lmx::elmx_error c_CT_TextBody::marshal(lmx::c_xml_writer& writer, const char* na
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_bodyPr) {
         cursor.next_known();
@@ -5107,7 +5100,7 @@ lmx::elmx_error c_CT_TextBodyProperties::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5223,7 +5216,7 @@ lmx::elmx_error c_CT_TextBodyProperties::marshal(lmx::c_xml_writer& writer, cons
     if (m_has_upright) put_attribute(writer, "upright", m_upright);
     if (m_has_compatLnSpc) put_attribute(writer, "compatLnSpc", m_compatLnSpc);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_prstTxWarp) {
         cursor.next_known();
@@ -5287,7 +5280,6 @@ lmx::elmx_error c_CT_TextBulletColorFollowText::unmarshal(lmx::c_xml_reader& rea
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5337,7 +5329,6 @@ lmx::elmx_error c_CT_TextBulletSizeFollowText::unmarshal(lmx::c_xml_reader& read
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5393,7 +5384,6 @@ lmx::elmx_error c_CT_TextBulletSizePercent::unmarshal(lmx::c_xml_reader& reader,
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5450,7 +5440,6 @@ lmx::elmx_error c_CT_TextBulletSizePoint::unmarshal(lmx::c_xml_reader& reader, c
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5501,7 +5490,6 @@ lmx::elmx_error c_CT_TextBulletTypefaceFollowText::unmarshal(lmx::c_xml_reader& 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5557,7 +5545,6 @@ lmx::elmx_error c_CT_TextCharBullet::unmarshal(lmx::c_xml_reader& reader, const 
     }
     if (!m_has_char) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "char", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5703,7 +5690,7 @@ lmx::elmx_error c_CT_TextCharacterProperties::unmarshal(lmx::c_xml_reader& reade
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5931,7 +5918,7 @@ lmx::elmx_error c_CT_TextCharacterProperties::marshal(lmx::c_xml_writer& writer,
     if (m_has_smtId) put_integer_attribute(writer, "smtId", m_smtId);
     if (m_has_bmk) put_attribute(writer, "bmk", m_bmk);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_ln) {
         cursor.next_known();
@@ -6076,7 +6063,7 @@ lmx::elmx_error c_CT_TextField::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6142,7 +6129,7 @@ lmx::elmx_error c_CT_TextField::marshal(lmx::c_xml_writer& writer, const char* n
     put_attribute(writer, "id", m_id);
     if (m_has_type) put_attribute(writer, "type", m_type);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_rPr) {
         cursor.next_known();
@@ -6203,7 +6190,6 @@ lmx::elmx_error c_CT_TextFont::unmarshal(lmx::c_xml_reader& reader, const std::s
     }
     if (!m_has_typeface) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "typeface", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6257,7 +6243,7 @@ lmx::elmx_error c_CT_TextLineBreak::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6298,7 +6284,7 @@ lmx::elmx_error c_CT_TextLineBreak::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_rPr) {
         cursor.next_known();
@@ -6327,7 +6313,7 @@ lmx::elmx_error c_CT_TextListStyle::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6448,7 +6434,7 @@ lmx::elmx_error c_CT_TextListStyle::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_defPPr) {
         cursor.next_known();
@@ -6527,7 +6513,6 @@ lmx::elmx_error c_CT_TextNoAutofit::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6577,7 +6562,6 @@ lmx::elmx_error c_CT_TextNoBullet::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6637,7 +6621,6 @@ lmx::elmx_error c_CT_TextNormalAutofit::unmarshal(lmx::c_xml_reader& reader, con
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6689,7 +6672,7 @@ lmx::elmx_error c_CT_TextParagraph::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6765,7 +6748,7 @@ lmx::elmx_error c_CT_TextParagraph::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_pPr) {
         cursor.next_known();
@@ -6900,7 +6883,7 @@ lmx::elmx_error c_CT_TextParagraphProperties::unmarshal(lmx::c_xml_reader& reade
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -7080,7 +7063,7 @@ lmx::elmx_error c_CT_TextParagraphProperties::marshal(lmx::c_xml_writer& writer,
     if (m_has_latinLnBrk) put_attribute(writer, "latinLnBrk", m_latinLnBrk);
     if (m_has_hangingPunct) put_attribute(writer, "hangingPunct", m_hangingPunct);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_lnSpc) {
         cursor.next_known();
@@ -7189,7 +7172,6 @@ lmx::elmx_error c_CT_TextShapeAutofit::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -7239,7 +7221,7 @@ lmx::elmx_error c_CT_TextSpacing::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -7288,7 +7270,7 @@ lmx::elmx_error c_CT_TextSpacing::marshal(lmx::c_xml_writer& writer, const char*
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_spcPct) {
         cursor.next_known();
@@ -7328,7 +7310,6 @@ lmx::elmx_error c_CT_TextSpacingPercent::unmarshal(lmx::c_xml_reader& reader, co
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -7385,7 +7366,6 @@ lmx::elmx_error c_CT_TextSpacingPoint::unmarshal(lmx::c_xml_reader& reader, cons
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -7446,7 +7426,6 @@ lmx::elmx_error c_CT_TextTabStop::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -7498,7 +7477,7 @@ lmx::elmx_error c_CT_TextTabStopList::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -7539,7 +7518,7 @@ lmx::elmx_error c_CT_TextTabStopList::marshal(lmx::c_xml_writer& writer, const c
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_tab) {
         cursor.next_known();
@@ -7568,7 +7547,6 @@ lmx::elmx_error c_CT_TextUnderlineFillFollowText::unmarshal(lmx::c_xml_reader& r
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -7618,7 +7596,7 @@ lmx::elmx_error c_CT_TextUnderlineFillGroupWrapper::unmarshal(lmx::c_xml_reader&
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -7699,7 +7677,7 @@ lmx::elmx_error c_CT_TextUnderlineFillGroupWrapper::marshal(lmx::c_xml_writer& w
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_noFill) {
         cursor.next_known();
@@ -7753,7 +7731,6 @@ lmx::elmx_error c_CT_TextUnderlineLineFollowText::unmarshal(lmx::c_xml_reader& r
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -7833,7 +7810,6 @@ lmx::elmx_error c_CT_TileInfoProperties::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -7899,7 +7875,6 @@ lmx::elmx_error c_CT_TintEffect::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -7966,7 +7941,7 @@ lmx::elmx_error c_CT_Transform2D::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -8018,7 +7993,7 @@ lmx::elmx_error c_CT_Transform2D::marshal(lmx::c_xml_writer& writer, const char*
     if (m_has_flipH) put_attribute(writer, "flipH", m_flipH);
     if (m_has_flipV) put_attribute(writer, "flipV", m_flipV);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_off) {
         cursor.next_known();
@@ -8082,7 +8057,6 @@ lmx::elmx_error c_CT_TransformEffect::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -8143,7 +8117,7 @@ lmx::elmx_error c_CT_TwoCellAnchor::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -8255,7 +8229,7 @@ lmx::elmx_error c_CT_TwoCellAnchor::marshal(lmx::c_xml_writer& writer, const cha
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_editAs) writer.attribute("editAs", std::string_view(enum_text(k_enum_ST_EditAs, 3, m_editAs)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_from) {
         cursor.next_known();
@@ -8342,7 +8316,6 @@ lmx::elmx_error c_CT_Vector3D::unmarshal(lmx::c_xml_reader& reader, const std::s
     if (!m_has_dy) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "dy", __LINE__);
     if (!m_has_dz) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "dz", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -8425,7 +8398,7 @@ lmx::elmx_error c_CT_XYAdjustHandle::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -8474,7 +8447,7 @@ lmx::elmx_error c_CT_XYAdjustHandle::marshal(lmx::c_xml_writer& writer, const ch
     if (m_has_minY) put_attribute(writer, "minY", m_minY);
     if (m_has_maxY) put_attribute(writer, "maxY", m_maxY);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_pos) {
         cursor.next_known();

@@ -75,7 +75,6 @@ lmx::elmx_error c_CT_Default::unmarshal(lmx::c_xml_reader& reader, const std::st
     if (!m_has_Extension) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "Extension", __LINE__);
     if (!m_has_ContentType) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ContentType", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -139,7 +138,6 @@ lmx::elmx_error c_CT_Override::unmarshal(lmx::c_xml_reader& reader, const std::s
     if (!m_has_ContentType) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ContentType", __LINE__);
     if (!m_has_PartName) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "PartName", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -195,7 +193,7 @@ lmx::elmx_error c_CT_Types::unmarshal(lmx::c_xml_reader& reader, const std::stri
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -246,7 +244,7 @@ lmx::elmx_error c_CT_Types::marshal(lmx::c_xml_writer& writer, const char* name)
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;

@@ -134,7 +134,7 @@ lmx::elmx_error c_CT_Relationships::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -175,7 +175,7 @@ lmx::elmx_error c_CT_Relationships::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_Relationship) {
         cursor.next_known();

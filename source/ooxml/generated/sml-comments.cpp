@@ -134,7 +134,7 @@ lmx::elmx_error c_CT_Authors::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -181,7 +181,6 @@ lmx::elmx_error c_CT_Authors::marshal(lmx::c_xml_writer& writer, const char* nam
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_author) {
         cursor.next_known();
@@ -216,7 +215,6 @@ lmx::elmx_error c_CT_BooleanProperty::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -292,7 +290,6 @@ lmx::elmx_error c_CT_Color::unmarshal(lmx::c_xml_reader& reader, const std::stri
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -369,7 +366,7 @@ lmx::elmx_error c_CT_Comment::unmarshal(lmx::c_xml_reader& reader, const std::st
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     if (!m_has_authorId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "authorId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -424,7 +421,7 @@ lmx::elmx_error c_CT_Comment::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_has_guid) put_attribute(writer, "guid", m_guid);
     if (m_has_shapeId) put_integer_attribute(writer, "shapeId", m_shapeId);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_text) {
         cursor.next_known();
@@ -458,7 +455,7 @@ lmx::elmx_error c_CT_CommentList::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -499,7 +496,7 @@ lmx::elmx_error c_CT_CommentList::marshal(lmx::c_xml_writer& writer, const char*
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_comment) {
         cursor.next_known();
@@ -588,7 +585,7 @@ lmx::elmx_error c_CT_CommentPr::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -643,7 +640,7 @@ lmx::elmx_error c_CT_CommentPr::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_justLastX) put_attribute(writer, "justLastX", m_justLastX);
     if (m_has_autoScale) put_attribute(writer, "autoScale", m_autoScale);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_anchor) {
         cursor.next_known();
@@ -676,7 +673,7 @@ lmx::elmx_error c_CT_Comments::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -737,7 +734,7 @@ lmx::elmx_error c_CT_Comments::marshal(lmx::c_xml_writer& writer, const char* na
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_authors) {
         cursor.next_known();
@@ -781,7 +778,6 @@ lmx::elmx_error c_CT_Extension::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -832,7 +828,7 @@ lmx::elmx_error c_CT_ExtensionList::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -873,7 +869,7 @@ lmx::elmx_error c_CT_ExtensionList::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_ext) {
         cursor.next_known();
@@ -908,7 +904,6 @@ lmx::elmx_error c_CT_FontName::unmarshal(lmx::c_xml_reader& reader, const std::s
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -965,7 +960,6 @@ lmx::elmx_error c_CT_FontScheme::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1022,7 +1016,6 @@ lmx::elmx_error c_CT_FontSize::unmarshal(lmx::c_xml_reader& reader, const std::s
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1079,7 +1072,6 @@ lmx::elmx_error c_CT_IntProperty::unmarshal(lmx::c_xml_reader& reader, const std
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1130,7 +1122,7 @@ lmx::elmx_error c_CT_Marker::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1231,7 +1223,6 @@ lmx::elmx_error c_CT_Marker::marshal(lmx::c_xml_writer& writer, const char* name
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_has_col) {
         cursor.next_known();
@@ -1289,7 +1280,7 @@ lmx::elmx_error c_CT_ObjectAnchor::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1344,7 +1335,7 @@ lmx::elmx_error c_CT_ObjectAnchor::marshal(lmx::c_xml_writer& writer, const char
     if (m_has_moveWithCells) put_attribute(writer, "moveWithCells", m_moveWithCells);
     if (m_has_sizeWithCells) put_attribute(writer, "sizeWithCells", m_sizeWithCells);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_from) {
         cursor.next_known();
@@ -1394,7 +1385,6 @@ lmx::elmx_error c_CT_PhoneticPr::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_fontId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "fontId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1459,7 +1449,7 @@ lmx::elmx_error c_CT_PhoneticRun::unmarshal(lmx::c_xml_reader& reader, const std
     if (!m_has_sb) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sb", __LINE__);
     if (!m_has_eb) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "eb", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1504,7 +1494,7 @@ lmx::elmx_error c_CT_PhoneticRun::marshal(lmx::c_xml_writer& writer, const char*
     put_integer_attribute(writer, "sb", m_sb);
     put_integer_attribute(writer, "eb", m_eb);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_t) {
         cursor.next_known();
@@ -1533,7 +1523,7 @@ lmx::elmx_error c_CT_RElt::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1584,7 +1574,7 @@ lmx::elmx_error c_CT_RElt::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_rPr) {
         cursor.next_known();
@@ -1618,7 +1608,7 @@ lmx::elmx_error c_CT_RPrElt::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1786,7 +1776,7 @@ lmx::elmx_error c_CT_RPrElt::marshal(lmx::c_xml_writer& writer, const char* name
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -2012,7 +2002,7 @@ lmx::elmx_error c_CT_Rst::unmarshal(lmx::c_xml_reader& reader, const std::string
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2077,7 +2067,7 @@ lmx::elmx_error c_CT_Rst::marshal(lmx::c_xml_writer& writer, const char* name) c
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_t) {
         cursor.next_known();
@@ -2126,7 +2116,6 @@ lmx::elmx_error c_CT_UnderlineProperty::unmarshal(lmx::c_xml_reader& reader, con
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2183,7 +2172,6 @@ lmx::elmx_error c_CT_VerticalAlignFontProperty::unmarshal(lmx::c_xml_reader& rea
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);

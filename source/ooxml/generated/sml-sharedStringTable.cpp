@@ -107,7 +107,6 @@ lmx::elmx_error c_CT_BooleanProperty::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -183,7 +182,6 @@ lmx::elmx_error c_CT_Color::unmarshal(lmx::c_xml_reader& reader, const std::stri
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -243,7 +241,6 @@ lmx::elmx_error c_CT_Extension::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -294,7 +291,7 @@ lmx::elmx_error c_CT_ExtensionList::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -335,7 +332,7 @@ lmx::elmx_error c_CT_ExtensionList::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_ext) {
         cursor.next_known();
@@ -370,7 +367,6 @@ lmx::elmx_error c_CT_FontName::unmarshal(lmx::c_xml_reader& reader, const std::s
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -427,7 +423,6 @@ lmx::elmx_error c_CT_FontScheme::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -484,7 +479,6 @@ lmx::elmx_error c_CT_FontSize::unmarshal(lmx::c_xml_reader& reader, const std::s
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -541,7 +535,6 @@ lmx::elmx_error c_CT_IntProperty::unmarshal(lmx::c_xml_reader& reader, const std
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -608,7 +601,6 @@ lmx::elmx_error c_CT_PhoneticPr::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_fontId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "fontId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -673,7 +665,7 @@ lmx::elmx_error c_CT_PhoneticRun::unmarshal(lmx::c_xml_reader& reader, const std
     if (!m_has_sb) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sb", __LINE__);
     if (!m_has_eb) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "eb", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -718,7 +710,7 @@ lmx::elmx_error c_CT_PhoneticRun::marshal(lmx::c_xml_writer& writer, const char*
     put_integer_attribute(writer, "sb", m_sb);
     put_integer_attribute(writer, "eb", m_eb);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_t) {
         cursor.next_known();
@@ -747,7 +739,7 @@ lmx::elmx_error c_CT_RElt::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -798,7 +790,7 @@ lmx::elmx_error c_CT_RElt::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_rPr) {
         cursor.next_known();
@@ -832,7 +824,7 @@ lmx::elmx_error c_CT_RPrElt::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1000,7 +992,7 @@ lmx::elmx_error c_CT_RPrElt::marshal(lmx::c_xml_writer& writer, const char* name
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -1226,7 +1218,7 @@ lmx::elmx_error c_CT_Rst::unmarshal(lmx::c_xml_reader& reader, const std::string
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1291,7 +1283,7 @@ lmx::elmx_error c_CT_Rst::marshal(lmx::c_xml_writer& writer, const char* name) c
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_t) {
         cursor.next_known();
@@ -1349,7 +1341,7 @@ lmx::elmx_error c_CT_Sst::unmarshal(lmx::c_xml_reader& reader, const std::string
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1400,7 +1392,7 @@ lmx::elmx_error c_CT_Sst::marshal(lmx::c_xml_writer& writer, const char* name) c
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_has_uniqueCount) put_integer_attribute(writer, "uniqueCount", m_uniqueCount);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_si) {
         cursor.next_known();
@@ -1439,7 +1431,6 @@ lmx::elmx_error c_CT_UnderlineProperty::unmarshal(lmx::c_xml_reader& reader, con
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1496,7 +1487,6 @@ lmx::elmx_error c_CT_VerticalAlignFontProperty::unmarshal(lmx::c_xml_reader& rea
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);

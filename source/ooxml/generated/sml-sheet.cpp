@@ -570,7 +570,7 @@ lmx::elmx_error c_CT_AutoFilter::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -628,7 +628,7 @@ lmx::elmx_error c_CT_AutoFilter::marshal(lmx::c_xml_writer& writer, const char* 
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_ref) put_attribute(writer, "ref", m_ref);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_filterColumn) {
         cursor.next_known();
@@ -672,7 +672,6 @@ lmx::elmx_error c_CT_BooleanProperty::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -748,7 +747,6 @@ lmx::elmx_error c_CT_Break::unmarshal(lmx::c_xml_reader& reader, const std::stri
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -833,7 +831,7 @@ lmx::elmx_error c_CT_Cell::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -911,7 +909,7 @@ lmx::elmx_error c_CT_Cell::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (m_has_vm) put_integer_attribute(writer, "vm", m_vm);
     if (m_has_ph) put_attribute(writer, "ph", m_ph);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_f) {
         cursor.next_known();
@@ -1083,7 +1081,7 @@ lmx::elmx_error c_CT_CellSmartTag::unmarshal(lmx::c_xml_reader& reader, const st
     }
     if (!m_has_type) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "type", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1127,7 +1125,7 @@ lmx::elmx_error c_CT_CellSmartTag::marshal(lmx::c_xml_writer& writer, const char
     if (m_has_deleted) put_attribute(writer, "deleted", m_deleted);
     if (m_has_xmlBased) put_attribute(writer, "xmlBased", m_xmlBased);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cellSmartTagPr) {
         cursor.next_known();
@@ -1168,7 +1166,6 @@ lmx::elmx_error c_CT_CellSmartTagPr::unmarshal(lmx::c_xml_reader& reader, const 
     if (!m_has_key) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "key", __LINE__);
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1226,7 +1223,7 @@ lmx::elmx_error c_CT_CellSmartTags::unmarshal(lmx::c_xml_reader& reader, const s
     }
     if (!m_has_r) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "r", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1270,7 +1267,7 @@ lmx::elmx_error c_CT_CellSmartTags::marshal(lmx::c_xml_writer& writer, const cha
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     put_attribute(writer, "r", m_r);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cellSmartTag) {
         cursor.next_known();
@@ -1305,7 +1302,6 @@ lmx::elmx_error c_CT_CellWatch::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_r) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "r", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1356,7 +1352,7 @@ lmx::elmx_error c_CT_CellWatches::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1399,7 +1395,7 @@ lmx::elmx_error c_CT_CellWatches::marshal(lmx::c_xml_writer& writer, const char*
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cellWatch) {
         cursor.next_known();
@@ -1494,7 +1490,7 @@ lmx::elmx_error c_CT_CfRule::unmarshal(lmx::c_xml_reader& reader, const std::str
     }
     if (!m_has_priority) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "priority", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1586,7 +1582,7 @@ lmx::elmx_error c_CT_CfRule::marshal(lmx::c_xml_writer& writer, const char* name
     if (m_has_stdDev) put_integer_attribute(writer, "stdDev", m_stdDev);
     if (m_has_equalAverage) put_attribute(writer, "equalAverage", m_equalAverage);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_formula) {
         cursor.next_known();
@@ -1652,7 +1648,7 @@ lmx::elmx_error c_CT_Cfvo::unmarshal(lmx::c_xml_reader& reader, const std::strin
     }
     if (!m_has_type) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "type", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1696,7 +1692,7 @@ lmx::elmx_error c_CT_Cfvo::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (m_has_val) put_attribute(writer, "val", m_val);
     if (m_has_gte) put_attribute(writer, "gte", m_gte);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_extLst) {
         cursor.next_known();
@@ -1777,7 +1773,6 @@ lmx::elmx_error c_CT_Col::unmarshal(lmx::c_xml_reader& reader, const std::string
     if (!m_has_min) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "min", __LINE__);
     if (!m_has_max) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "max", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1862,7 +1857,6 @@ lmx::elmx_error c_CT_Color::unmarshal(lmx::c_xml_reader& reader, const std::stri
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1927,7 +1921,6 @@ lmx::elmx_error c_CT_ColorFilter::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1979,7 +1972,7 @@ lmx::elmx_error c_CT_ColorScale::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2032,7 +2025,7 @@ lmx::elmx_error c_CT_ColorScale::marshal(lmx::c_xml_writer& writer, const char* 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cfvo) {
         cursor.next_known();
@@ -2066,7 +2059,7 @@ lmx::elmx_error c_CT_Cols::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2109,7 +2102,7 @@ lmx::elmx_error c_CT_Cols::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_col) {
         cursor.next_known();
@@ -2148,7 +2141,7 @@ lmx::elmx_error c_CT_ConditionalFormatting::unmarshal(lmx::c_xml_reader& reader,
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2201,7 +2194,7 @@ lmx::elmx_error c_CT_ConditionalFormatting::marshal(lmx::c_xml_writer& writer, c
     if (m_has_pivot) put_attribute(writer, "pivot", m_pivot);
     if (m_has_sqref) put_attribute(writer, "sqref", m_sqref);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cfRule) {
         cursor.next_known();
@@ -2252,7 +2245,7 @@ lmx::elmx_error c_CT_Control::unmarshal(lmx::c_xml_reader& reader, const std::st
     if (!m_has_shapeId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "shapeId", __LINE__);
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2296,7 +2289,7 @@ lmx::elmx_error c_CT_Control::marshal(lmx::c_xml_writer& writer, const char* nam
     put_attribute(writer, "r:id", m_id);
     if (m_has_name) put_attribute(writer, "name", m_name);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_controlPr) {
         cursor.next_known();
@@ -2400,7 +2393,7 @@ lmx::elmx_error c_CT_ControlPr::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2458,7 +2451,7 @@ lmx::elmx_error c_CT_ControlPr::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_cf) put_attribute(writer, "cf", m_cf);
     if (m_has_id) put_attribute(writer, "r:id", m_id);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_anchor) {
         cursor.next_known();
@@ -2487,7 +2480,7 @@ lmx::elmx_error c_CT_Controls::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2530,7 +2523,7 @@ lmx::elmx_error c_CT_Controls::marshal(lmx::c_xml_writer& writer, const char* na
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_control) {
         cursor.next_known();
@@ -2569,7 +2562,6 @@ lmx::elmx_error c_CT_CustomFilter::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2626,7 +2618,7 @@ lmx::elmx_error c_CT_CustomFilters::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2670,7 +2662,7 @@ lmx::elmx_error c_CT_CustomFilters::marshal(lmx::c_xml_writer& writer, const cha
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_and) put_attribute(writer, "and", m_and);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_customFilter) {
         cursor.next_known();
@@ -2699,7 +2691,7 @@ lmx::elmx_error c_CT_CustomProperties::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2742,7 +2734,7 @@ lmx::elmx_error c_CT_CustomProperties::marshal(lmx::c_xml_writer& writer, const 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_customPr) {
         cursor.next_known();
@@ -2783,7 +2775,6 @@ lmx::elmx_error c_CT_CustomProperty::unmarshal(lmx::c_xml_reader& reader, const 
     if (!m_has_name) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "name", __LINE__);
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2936,7 +2927,7 @@ lmx::elmx_error c_CT_CustomSheetView::unmarshal(lmx::c_xml_reader& reader, const
     }
     if (!m_has_guid) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "guid", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3069,7 +3060,7 @@ lmx::elmx_error c_CT_CustomSheetView::marshal(lmx::c_xml_writer& writer, const c
     if (m_has_showRuler) put_attribute(writer, "showRuler", m_showRuler);
     if (m_has_topLeftCell) put_attribute(writer, "topLeftCell", m_topLeftCell);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_pane) {
         cursor.next_known();
@@ -3143,7 +3134,7 @@ lmx::elmx_error c_CT_CustomSheetViews::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3186,7 +3177,7 @@ lmx::elmx_error c_CT_CustomSheetViews::marshal(lmx::c_xml_writer& writer, const 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_customSheetView) {
         cursor.next_known();
@@ -3230,7 +3221,7 @@ lmx::elmx_error c_CT_DataBar::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3286,7 +3277,7 @@ lmx::elmx_error c_CT_DataBar::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_has_maxLength) put_integer_attribute(writer, "maxLength", m_maxLength);
     if (m_has_showValue) put_attribute(writer, "showValue", m_showValue);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cfvo) {
         cursor.next_known();
@@ -3345,7 +3336,7 @@ lmx::elmx_error c_CT_DataConsolidate::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3391,7 +3382,7 @@ lmx::elmx_error c_CT_DataConsolidate::marshal(lmx::c_xml_writer& writer, const c
     if (m_has_topLabels) put_attribute(writer, "topLabels", m_topLabels);
     if (m_has_link) put_attribute(writer, "link", m_link);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_dataRefs) {
         cursor.next_known();
@@ -3440,7 +3431,6 @@ lmx::elmx_error c_CT_DataRef::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3499,7 +3489,7 @@ lmx::elmx_error c_CT_DataRefs::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3541,7 +3531,7 @@ lmx::elmx_error c_CT_DataRefs::marshal(lmx::c_xml_writer& writer, const char* na
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_dataRef) {
         cursor.next_known();
@@ -3636,7 +3626,7 @@ lmx::elmx_error c_CT_DataValidation::unmarshal(lmx::c_xml_reader& reader, const 
     }
     if (!m_has_sqref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sqref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3712,7 +3702,6 @@ lmx::elmx_error c_CT_DataValidation::marshal(lmx::c_xml_writer& writer, const ch
     if (m_has_prompt) put_attribute(writer, "prompt", m_prompt);
     put_attribute(writer, "sqref", m_sqref);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_has_formula1) {
         cursor.next_known();
@@ -3768,7 +3757,7 @@ lmx::elmx_error c_CT_DataValidations::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3815,7 +3804,7 @@ lmx::elmx_error c_CT_DataValidations::marshal(lmx::c_xml_writer& writer, const c
     if (m_has_yWindow) put_integer_attribute(writer, "yWindow", m_yWindow);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_dataValidation) {
         cursor.next_known();
@@ -3881,7 +3870,6 @@ lmx::elmx_error c_CT_DateGroupItem::unmarshal(lmx::c_xml_reader& reader, const s
     if (!m_has_year) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "year", __LINE__);
     if (!m_has_dateTimeGrouping) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "dateTimeGrouping", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3944,7 +3932,6 @@ lmx::elmx_error c_CT_Drawing::unmarshal(lmx::c_xml_reader& reader, const std::st
     }
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4091,7 +4078,6 @@ lmx::elmx_error c_CT_DrawingHF::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);

@@ -69,7 +69,6 @@ lmx::elmx_error c_CT_DynamicFilter::unmarshal(lmx::c_xml_reader& reader, const s
     }
     if (!m_has_type) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "type", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -129,7 +128,6 @@ lmx::elmx_error c_CT_Extension::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -180,7 +178,7 @@ lmx::elmx_error c_CT_ExtensionList::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -221,7 +219,7 @@ lmx::elmx_error c_CT_ExtensionList::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_ext) {
         cursor.next_known();
@@ -255,7 +253,6 @@ lmx::elmx_error c_CT_Filter::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -322,7 +319,7 @@ lmx::elmx_error c_CT_FilterColumn::unmarshal(lmx::c_xml_reader& reader, const st
     }
     if (!m_has_colId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "colId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -414,7 +411,7 @@ lmx::elmx_error c_CT_FilterColumn::marshal(lmx::c_xml_writer& writer, const char
     if (m_has_hiddenButton) put_attribute(writer, "hiddenButton", m_hiddenButton);
     if (m_has_showButton) put_attribute(writer, "showButton", m_showButton);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_filters) {
         cursor.next_known();
@@ -483,7 +480,7 @@ lmx::elmx_error c_CT_Filters::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -534,7 +531,7 @@ lmx::elmx_error c_CT_Filters::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_has_blank) put_attribute(writer, "blank", m_blank);
     if (m_has_calendarType) writer.attribute("calendarType", std::string_view(enum_text(k_enum_ST_CalendarType, 14, m_calendarType)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_filter) {
         cursor.next_known();
@@ -574,7 +571,6 @@ lmx::elmx_error c_CT_FontName::unmarshal(lmx::c_xml_reader& reader, const std::s
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -631,7 +627,6 @@ lmx::elmx_error c_CT_FontScheme::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -688,7 +683,6 @@ lmx::elmx_error c_CT_FontSize::unmarshal(lmx::c_xml_reader& reader, const std::s
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -759,7 +753,7 @@ lmx::elmx_error c_CT_HeaderFooter::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -886,7 +880,6 @@ lmx::elmx_error c_CT_HeaderFooter::marshal(lmx::c_xml_writer& writer, const char
     if (m_has_scaleWithDoc) put_attribute(writer, "scaleWithDoc", m_scaleWithDoc);
     if (m_has_alignWithMargins) put_attribute(writer, "alignWithMargins", m_alignWithMargins);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_has_oddHeader) {
         cursor.next_known();
@@ -972,7 +965,6 @@ lmx::elmx_error c_CT_Hyperlink::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1027,7 +1019,7 @@ lmx::elmx_error c_CT_Hyperlinks::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1070,7 +1062,7 @@ lmx::elmx_error c_CT_Hyperlinks::marshal(lmx::c_xml_writer& writer, const char* 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_hyperlink) {
         cursor.next_known();
@@ -1110,7 +1102,6 @@ lmx::elmx_error c_CT_IconFilter::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_iconSet) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "iconSet", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1182,7 +1173,7 @@ lmx::elmx_error c_CT_IconSet::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1229,7 +1220,7 @@ lmx::elmx_error c_CT_IconSet::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_has_percent) put_attribute(writer, "percent", m_percent);
     if (m_has_reverse) put_attribute(writer, "reverse", m_reverse);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cfvo) {
         cursor.next_known();
@@ -1309,7 +1300,6 @@ lmx::elmx_error c_CT_IgnoredError::unmarshal(lmx::c_xml_reader& reader, const st
     }
     if (!m_has_sqref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sqref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1369,7 +1359,7 @@ lmx::elmx_error c_CT_IgnoredErrors::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1420,7 +1410,7 @@ lmx::elmx_error c_CT_IgnoredErrors::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_ignoredError) {
         cursor.next_known();
@@ -1460,7 +1450,6 @@ lmx::elmx_error c_CT_Index::unmarshal(lmx::c_xml_reader& reader, const std::stri
     }
     if (!m_has_v) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "v", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1538,7 +1527,6 @@ lmx::elmx_error c_CT_InputCells::unmarshal(lmx::c_xml_reader& reader, const std:
     if (!m_has_r) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "r", __LINE__);
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1599,7 +1587,6 @@ lmx::elmx_error c_CT_IntProperty::unmarshal(lmx::c_xml_reader& reader, const std
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1656,7 +1643,6 @@ lmx::elmx_error c_CT_LegacyDrawing::unmarshal(lmx::c_xml_reader& reader, const s
     }
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1707,7 +1693,7 @@ lmx::elmx_error c_CT_Marker::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1808,7 +1794,6 @@ lmx::elmx_error c_CT_Marker::marshal(lmx::c_xml_writer& writer, const char* name
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_has_col) {
         cursor.next_known();
@@ -1862,7 +1847,6 @@ lmx::elmx_error c_CT_MergeCell::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1918,7 +1902,7 @@ lmx::elmx_error c_CT_MergeCells::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1962,7 +1946,7 @@ lmx::elmx_error c_CT_MergeCells::marshal(lmx::c_xml_writer& writer, const char* 
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_mergeCell) {
         cursor.next_known();
@@ -2001,7 +1985,7 @@ lmx::elmx_error c_CT_ObjectAnchor::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2056,7 +2040,7 @@ lmx::elmx_error c_CT_ObjectAnchor::marshal(lmx::c_xml_writer& writer, const char
     if (m_has_moveWithCells) put_attribute(writer, "moveWithCells", m_moveWithCells);
     if (m_has_sizeWithCells) put_attribute(writer, "sizeWithCells", m_sizeWithCells);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_from) {
         cursor.next_known();
@@ -2150,7 +2134,7 @@ lmx::elmx_error c_CT_ObjectPr::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2205,7 +2189,7 @@ lmx::elmx_error c_CT_ObjectPr::marshal(lmx::c_xml_writer& writer, const char* na
     if (m_has_dde) put_attribute(writer, "dde", m_dde);
     if (m_has_id) put_attribute(writer, "r:id", m_id);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_anchor) {
         cursor.next_known();
@@ -2270,7 +2254,7 @@ lmx::elmx_error c_CT_OleObject::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_shapeId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "shapeId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2318,7 +2302,7 @@ lmx::elmx_error c_CT_OleObject::marshal(lmx::c_xml_writer& writer, const char* n
     put_integer_attribute(writer, "shapeId", m_shapeId);
     if (m_has_id) put_attribute(writer, "r:id", m_id);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_objectPr) {
         cursor.next_known();
@@ -2347,7 +2331,7 @@ lmx::elmx_error c_CT_OleObjects::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2390,7 +2374,7 @@ lmx::elmx_error c_CT_OleObjects::marshal(lmx::c_xml_writer& writer, const char* 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_oleObject) {
         cursor.next_known();
@@ -2439,7 +2423,6 @@ lmx::elmx_error c_CT_OutlinePr::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2503,7 +2486,7 @@ lmx::elmx_error c_CT_PageBreak::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2546,7 +2529,7 @@ lmx::elmx_error c_CT_PageBreak::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_has_manualBreakCount) put_integer_attribute(writer, "manualBreakCount", m_manualBreakCount);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_brk) {
         cursor.next_known();
@@ -2611,7 +2594,6 @@ lmx::elmx_error c_CT_PageMargins::unmarshal(lmx::c_xml_reader& reader, const std
     if (!m_has_header) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "header", __LINE__);
     if (!m_has_footer) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "footer", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2677,7 +2659,6 @@ lmx::elmx_error c_CT_PageSetUpPr::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2824,7 +2805,6 @@ lmx::elmx_error c_CT_PageSetup::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2918,7 +2898,6 @@ lmx::elmx_error c_CT_Pane::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2989,7 +2968,6 @@ lmx::elmx_error c_CT_PhoneticPr::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_fontId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "fontId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3054,7 +3032,7 @@ lmx::elmx_error c_CT_PhoneticRun::unmarshal(lmx::c_xml_reader& reader, const std
     if (!m_has_sb) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sb", __LINE__);
     if (!m_has_eb) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "eb", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3099,7 +3077,7 @@ lmx::elmx_error c_CT_PhoneticRun::marshal(lmx::c_xml_writer& writer, const char*
     put_integer_attribute(writer, "sb", m_sb);
     put_integer_attribute(writer, "eb", m_eb);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_t) {
         cursor.next_known();

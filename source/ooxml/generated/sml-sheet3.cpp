@@ -103,7 +103,7 @@ lmx::elmx_error c_CT_PivotArea::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -164,7 +164,7 @@ lmx::elmx_error c_CT_PivotArea::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_axis) writer.attribute("axis", std::string_view(enum_text(k_enum_ST_Axis, 4, m_axis)));
     if (m_has_fieldPosition) put_integer_attribute(writer, "fieldPosition", m_fieldPosition);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_references) {
         cursor.next_known();
@@ -283,7 +283,7 @@ lmx::elmx_error c_CT_PivotAreaReference::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -349,7 +349,7 @@ lmx::elmx_error c_CT_PivotAreaReference::marshal(lmx::c_xml_writer& writer, cons
     if (m_has_varSubtotal) put_attribute(writer, "varSubtotal", m_varSubtotal);
     if (m_has_varPSubtotal) put_attribute(writer, "varPSubtotal", m_varPSubtotal);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_x) {
         cursor.next_known();
@@ -388,7 +388,7 @@ lmx::elmx_error c_CT_PivotAreaReferences::unmarshal(lmx::c_xml_reader& reader, c
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -432,7 +432,7 @@ lmx::elmx_error c_CT_PivotAreaReferences::marshal(lmx::c_xml_writer& writer, con
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_reference) {
         cursor.next_known();
@@ -546,7 +546,7 @@ lmx::elmx_error c_CT_PivotSelection::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -606,7 +606,7 @@ lmx::elmx_error c_CT_PivotSelection::marshal(lmx::c_xml_writer& writer, const ch
     if (m_has_click) put_integer_attribute(writer, "click", m_click);
     if (m_has_id) put_attribute(writer, "r:id", m_id);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_pivotArea) {
         cursor.next_known();
@@ -660,7 +660,6 @@ lmx::elmx_error c_CT_PrintOptions::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -757,7 +756,7 @@ lmx::elmx_error c_CT_ProtectedRange::unmarshal(lmx::c_xml_reader& reader, const 
     if (!m_has_sqref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sqref", __LINE__);
     if (!m_has_name) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "name", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -812,7 +811,6 @@ lmx::elmx_error c_CT_ProtectedRange::marshal(lmx::c_xml_writer& writer, const ch
     if (m_has_saltValue) writer.attribute("saltValue", std::string_view(m_saltValue.to_base64()));
     if (m_has_spinCount) put_integer_attribute(writer, "spinCount", m_spinCount);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_securityDescriptor_elem) {
         cursor.next_known();
@@ -842,7 +840,7 @@ lmx::elmx_error c_CT_ProtectedRanges::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -885,7 +883,7 @@ lmx::elmx_error c_CT_ProtectedRanges::marshal(lmx::c_xml_writer& writer, const c
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_protectedRange) {
         cursor.next_known();
@@ -914,7 +912,7 @@ lmx::elmx_error c_CT_RElt::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -965,7 +963,7 @@ lmx::elmx_error c_CT_RElt::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_rPr) {
         cursor.next_known();
@@ -999,7 +997,7 @@ lmx::elmx_error c_CT_RPrElt::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1167,7 +1165,7 @@ lmx::elmx_error c_CT_RPrElt::marshal(lmx::c_xml_writer& writer, const char* name
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -1453,7 +1451,7 @@ lmx::elmx_error c_CT_Row::unmarshal(lmx::c_xml_reader& reader, const std::string
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1514,7 +1512,7 @@ lmx::elmx_error c_CT_Row::marshal(lmx::c_xml_writer& writer, const char* name) c
     if (m_has_thickBot) put_attribute(writer, "thickBot", m_thickBot);
     if (m_has_ph) put_attribute(writer, "ph", m_ph);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_c) {
         cursor.next_known();
@@ -1548,7 +1546,7 @@ lmx::elmx_error c_CT_Rst::unmarshal(lmx::c_xml_reader& reader, const std::string
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1613,7 +1611,7 @@ lmx::elmx_error c_CT_Rst::marshal(lmx::c_xml_writer& writer, const char* name) c
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_t) {
         cursor.next_known();
@@ -1688,7 +1686,7 @@ lmx::elmx_error c_CT_Scenario::unmarshal(lmx::c_xml_reader& reader, const std::s
     }
     if (!m_has_name) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "name", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1737,7 +1735,7 @@ lmx::elmx_error c_CT_Scenario::marshal(lmx::c_xml_writer& writer, const char* na
     if (m_has_user) put_attribute(writer, "user", m_user);
     if (m_has_comment) put_attribute(writer, "comment", m_comment);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_inputCells) {
         cursor.next_known();
@@ -1781,7 +1779,7 @@ lmx::elmx_error c_CT_Scenarios::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1827,7 +1825,7 @@ lmx::elmx_error c_CT_Scenarios::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_show) put_integer_attribute(writer, "show", m_show);
     if (m_has_sqref) put_attribute(writer, "sqref", m_sqref);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_scenario) {
         cursor.next_known();
@@ -1876,7 +1874,6 @@ lmx::elmx_error c_CT_Selection::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1936,7 +1933,6 @@ lmx::elmx_error c_CT_SheetBackgroundPicture::unmarshal(lmx::c_xml_reader& reader
     }
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1992,7 +1988,6 @@ lmx::elmx_error c_CT_SheetCalcPr::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2048,7 +2043,7 @@ lmx::elmx_error c_CT_SheetData::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     std::int64_t row_number = 0;
     c_CT_Row* worker = handler ? new c_CT_Row() : nullptr;
     const quire::ooxml::c_owned<c_CT_Row> worker_owner = [&] {
@@ -2112,7 +2107,7 @@ lmx::elmx_error c_CT_SheetData::marshal(lmx::c_xml_writer& writer, const char* n
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_row) {
         cursor.next_known();
@@ -2147,7 +2142,6 @@ lmx::elmx_error c_CT_SheetDimension::unmarshal(lmx::c_xml_reader& reader, const 
     }
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2244,7 +2238,6 @@ lmx::elmx_error c_CT_SheetFormatPr::unmarshal(lmx::c_xml_reader& reader, const s
     }
     if (!m_has_defaultRowHeight) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "defaultRowHeight", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2348,7 +2341,7 @@ lmx::elmx_error c_CT_SheetPr::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2414,7 +2407,7 @@ lmx::elmx_error c_CT_SheetPr::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_has_filterMode) put_attribute(writer, "filterMode", m_filterMode);
     if (m_has_enableFormatConditionsCalculation) put_attribute(writer, "enableFormatConditionsCalculation", m_enableFormatConditionsCalculation);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_tabColor) {
         cursor.next_known();
@@ -2558,7 +2551,6 @@ lmx::elmx_error c_CT_SheetProtection::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2725,7 +2717,7 @@ lmx::elmx_error c_CT_SheetView::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_workbookViewId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "workbookViewId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2809,7 +2801,7 @@ lmx::elmx_error c_CT_SheetView::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_zoomScalePageLayoutView) put_integer_attribute(writer, "zoomScalePageLayoutView", m_zoomScalePageLayoutView);
     put_integer_attribute(writer, "workbookViewId", m_workbookViewId);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_pane) {
         cursor.next_known();
@@ -2853,7 +2845,7 @@ lmx::elmx_error c_CT_SheetViews::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2904,7 +2896,7 @@ lmx::elmx_error c_CT_SheetViews::marshal(lmx::c_xml_writer& writer, const char* 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_sheetView) {
         cursor.next_known();
@@ -2938,7 +2930,7 @@ lmx::elmx_error c_CT_SmartTags::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2981,7 +2973,7 @@ lmx::elmx_error c_CT_SmartTags::marshal(lmx::c_xml_writer& writer, const char* n
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cellSmartTags) {
         cursor.next_known();
@@ -3046,7 +3038,6 @@ lmx::elmx_error c_CT_SortCondition::unmarshal(lmx::c_xml_reader& reader, const s
     }
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3124,7 +3115,7 @@ lmx::elmx_error c_CT_SortState::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3177,7 +3168,7 @@ lmx::elmx_error c_CT_SortState::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_sortMethod) writer.attribute("sortMethod", std::string_view(enum_text(k_enum_ST_SortMethod, 3, m_sortMethod)));
     put_attribute(writer, "ref", m_ref);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_sortCondition) {
         cursor.next_known();
@@ -3217,7 +3208,6 @@ lmx::elmx_error c_CT_TablePart::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3273,7 +3263,7 @@ lmx::elmx_error c_CT_TableParts::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3315,7 +3305,7 @@ lmx::elmx_error c_CT_TableParts::marshal(lmx::c_xml_writer& writer, const char* 
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_tablePart) {
         cursor.next_known();
@@ -3365,7 +3355,6 @@ lmx::elmx_error c_CT_Top10::unmarshal(lmx::c_xml_reader& reader, const std::stri
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3424,7 +3413,6 @@ lmx::elmx_error c_CT_UnderlineProperty::unmarshal(lmx::c_xml_reader& reader, con
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3481,7 +3469,6 @@ lmx::elmx_error c_CT_VerticalAlignFontProperty::unmarshal(lmx::c_xml_reader& rea
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3576,7 +3563,6 @@ lmx::elmx_error c_CT_WebPublishItem::unmarshal(lmx::c_xml_reader& reader, const 
     if (!m_has_sourceType) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sourceType", __LINE__);
     if (!m_has_destinationFile) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "destinationFile", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3639,7 +3625,7 @@ lmx::elmx_error c_CT_WebPublishItems::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3683,7 +3669,7 @@ lmx::elmx_error c_CT_WebPublishItems::marshal(lmx::c_xml_writer& writer, const c
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_webPublishItem) {
         cursor.next_known();
@@ -3721,7 +3707,7 @@ lmx::elmx_error c_CT_Worksheet::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4068,7 +4054,7 @@ lmx::elmx_error c_CT_Worksheet::marshal(lmx::c_xml_writer& writer, const char* n
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_sheetPr) {
         cursor.next_known();

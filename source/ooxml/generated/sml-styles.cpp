@@ -182,7 +182,6 @@ lmx::elmx_error c_CT_BooleanProperty::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -248,7 +247,7 @@ lmx::elmx_error c_CT_Border::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -356,7 +355,7 @@ lmx::elmx_error c_CT_Border::marshal(lmx::c_xml_writer& writer, const char* name
     if (m_has_diagonalDown) put_attribute(writer, "diagonalDown", m_diagonalDown);
     if (m_has_outline) put_attribute(writer, "outline", m_outline);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_start) {
         cursor.next_known();
@@ -430,7 +429,7 @@ lmx::elmx_error c_CT_BorderPr::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -472,7 +471,7 @@ lmx::elmx_error c_CT_BorderPr::marshal(lmx::c_xml_writer& writer, const char* na
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_style) writer.attribute("style", std::string_view(enum_text(k_enum_ST_BorderStyle, 14, m_style)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_color) {
         cursor.next_known();
@@ -506,7 +505,7 @@ lmx::elmx_error c_CT_Borders::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -548,7 +547,7 @@ lmx::elmx_error c_CT_Borders::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_border) {
         cursor.next_known();
@@ -622,7 +621,6 @@ lmx::elmx_error c_CT_CellAlignment::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -691,7 +689,6 @@ lmx::elmx_error c_CT_CellProtection::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -774,7 +771,7 @@ lmx::elmx_error c_CT_CellStyle::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_xfId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "xfId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -821,7 +818,7 @@ lmx::elmx_error c_CT_CellStyle::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_hidden) put_attribute(writer, "hidden", m_hidden);
     if (m_has_customBuiltin) put_attribute(writer, "customBuiltin", m_customBuiltin);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_extLst) {
         cursor.next_known();
@@ -855,7 +852,7 @@ lmx::elmx_error c_CT_CellStyleXfs::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -899,7 +896,7 @@ lmx::elmx_error c_CT_CellStyleXfs::marshal(lmx::c_xml_writer& writer, const char
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_xf) {
         cursor.next_known();
@@ -933,7 +930,7 @@ lmx::elmx_error c_CT_CellStyles::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -977,7 +974,7 @@ lmx::elmx_error c_CT_CellStyles::marshal(lmx::c_xml_writer& writer, const char* 
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cellStyle) {
         cursor.next_known();
@@ -1011,7 +1008,7 @@ lmx::elmx_error c_CT_CellXfs::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1055,7 +1052,7 @@ lmx::elmx_error c_CT_CellXfs::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_xf) {
         cursor.next_known();
@@ -1109,7 +1106,6 @@ lmx::elmx_error c_CT_Color::unmarshal(lmx::c_xml_reader& reader, const std::stri
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1164,7 +1160,7 @@ lmx::elmx_error c_CT_Colors::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1213,7 +1209,7 @@ lmx::elmx_error c_CT_Colors::marshal(lmx::c_xml_writer& writer, const char* name
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_indexedColors) {
         cursor.next_known();
@@ -1247,7 +1243,7 @@ lmx::elmx_error c_CT_Dxf::unmarshal(lmx::c_xml_reader& reader, const std::string
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1336,7 +1332,7 @@ lmx::elmx_error c_CT_Dxf::marshal(lmx::c_xml_writer& writer, const char* name) c
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_font) {
         cursor.next_known();
@@ -1400,7 +1396,7 @@ lmx::elmx_error c_CT_Dxfs::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1442,7 +1438,7 @@ lmx::elmx_error c_CT_Dxfs::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_dxf) {
         cursor.next_known();
@@ -1476,7 +1472,6 @@ lmx::elmx_error c_CT_Extension::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1527,7 +1522,7 @@ lmx::elmx_error c_CT_ExtensionList::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1568,7 +1563,7 @@ lmx::elmx_error c_CT_ExtensionList::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_ext) {
         cursor.next_known();
@@ -1597,7 +1592,7 @@ lmx::elmx_error c_CT_Fill::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1646,7 +1641,7 @@ lmx::elmx_error c_CT_Fill::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_patternFill) {
         cursor.next_known();
@@ -1685,7 +1680,7 @@ lmx::elmx_error c_CT_Fills::unmarshal(lmx::c_xml_reader& reader, const std::stri
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1727,7 +1722,7 @@ lmx::elmx_error c_CT_Fills::marshal(lmx::c_xml_writer& writer, const char* name)
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_fill) {
         cursor.next_known();
@@ -1756,7 +1751,7 @@ lmx::elmx_error c_CT_Font::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1924,7 +1919,7 @@ lmx::elmx_error c_CT_Font::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -2156,7 +2151,6 @@ lmx::elmx_error c_CT_FontFamily::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2213,7 +2207,6 @@ lmx::elmx_error c_CT_FontName::unmarshal(lmx::c_xml_reader& reader, const std::s
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2270,7 +2263,6 @@ lmx::elmx_error c_CT_FontScheme::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2327,7 +2319,6 @@ lmx::elmx_error c_CT_FontSize::unmarshal(lmx::c_xml_reader& reader, const std::s
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2383,7 +2374,7 @@ lmx::elmx_error c_CT_Fonts::unmarshal(lmx::c_xml_reader& reader, const std::stri
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2425,7 +2416,7 @@ lmx::elmx_error c_CT_Fonts::marshal(lmx::c_xml_writer& writer, const char* name)
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_font) {
         cursor.next_known();
@@ -2484,7 +2475,7 @@ lmx::elmx_error c_CT_GradientFill::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2531,7 +2522,7 @@ lmx::elmx_error c_CT_GradientFill::marshal(lmx::c_xml_writer& writer, const char
     if (m_has_top) put_attribute(writer, "top", m_top);
     if (m_has_bottom) put_attribute(writer, "bottom", m_bottom);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_stop) {
         cursor.next_known();
@@ -2566,7 +2557,7 @@ lmx::elmx_error c_CT_GradientStop::unmarshal(lmx::c_xml_reader& reader, const st
     }
     if (!m_has_position) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "position", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2610,7 +2601,7 @@ lmx::elmx_error c_CT_GradientStop::marshal(lmx::c_xml_writer& writer, const char
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     put_attribute(writer, "position", m_position);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_color) {
         cursor.next_known();
@@ -2639,7 +2630,7 @@ lmx::elmx_error c_CT_IndexedColors::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2682,7 +2673,7 @@ lmx::elmx_error c_CT_IndexedColors::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_rgbColor) {
         cursor.next_known();
@@ -2717,7 +2708,6 @@ lmx::elmx_error c_CT_IntProperty::unmarshal(lmx::c_xml_reader& reader, const std
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2768,7 +2758,7 @@ lmx::elmx_error c_CT_MRUColors::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2811,7 +2801,7 @@ lmx::elmx_error c_CT_MRUColors::marshal(lmx::c_xml_writer& writer, const char* n
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_color) {
         cursor.next_known();
@@ -2852,7 +2842,6 @@ lmx::elmx_error c_CT_NumFmt::unmarshal(lmx::c_xml_reader& reader, const std::str
     if (!m_has_numFmtId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "numFmtId", __LINE__);
     if (!m_has_formatCode) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "formatCode", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2909,7 +2898,7 @@ lmx::elmx_error c_CT_NumFmts::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2951,7 +2940,7 @@ lmx::elmx_error c_CT_NumFmts::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_numFmt) {
         cursor.next_known();
@@ -2985,7 +2974,7 @@ lmx::elmx_error c_CT_PatternFill::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3035,7 +3024,7 @@ lmx::elmx_error c_CT_PatternFill::marshal(lmx::c_xml_writer& writer, const char*
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_patternType) writer.attribute("patternType", std::string_view(enum_text(k_enum_ST_PatternType, 19, m_patternType)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_fgColor) {
         cursor.next_known();
@@ -3074,7 +3063,6 @@ lmx::elmx_error c_CT_RgbColor::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3129,7 +3117,7 @@ lmx::elmx_error c_CT_Stylesheet::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3250,7 +3238,7 @@ lmx::elmx_error c_CT_Stylesheet::marshal(lmx::c_xml_writer& writer, const char* 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_numFmts) {
         cursor.next_known();
@@ -3350,7 +3338,7 @@ lmx::elmx_error c_CT_TableStyle::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_name) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "name", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3395,7 +3383,7 @@ lmx::elmx_error c_CT_TableStyle::marshal(lmx::c_xml_writer& writer, const char* 
     if (m_has_table) put_attribute(writer, "table", m_table);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_tableStyleElement) {
         cursor.next_known();
@@ -3440,7 +3428,6 @@ lmx::elmx_error c_CT_TableStyleElement::unmarshal(lmx::c_xml_reader& reader, con
     }
     if (!m_has_type) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "type", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3508,7 +3495,7 @@ lmx::elmx_error c_CT_TableStyles::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3552,7 +3539,7 @@ lmx::elmx_error c_CT_TableStyles::marshal(lmx::c_xml_writer& writer, const char*
     if (m_has_defaultTableStyle) put_attribute(writer, "defaultTableStyle", m_defaultTableStyle);
     if (m_has_defaultPivotStyle) put_attribute(writer, "defaultPivotStyle", m_defaultPivotStyle);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_tableStyle) {
         cursor.next_known();
@@ -3586,7 +3573,6 @@ lmx::elmx_error c_CT_UnderlineProperty::unmarshal(lmx::c_xml_reader& reader, con
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3643,7 +3629,6 @@ lmx::elmx_error c_CT_VerticalAlignFontProperty::unmarshal(lmx::c_xml_reader& rea
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3759,7 +3744,7 @@ lmx::elmx_error c_CT_Xf::unmarshal(lmx::c_xml_reader& reader, const std::string&
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3829,7 +3814,7 @@ lmx::elmx_error c_CT_Xf::marshal(lmx::c_xml_writer& writer, const char* name) co
     if (m_has_applyAlignment) put_attribute(writer, "applyAlignment", m_applyAlignment);
     if (m_has_applyProtection) put_attribute(writer, "applyProtection", m_applyProtection);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_alignment) {
         cursor.next_known();

@@ -162,7 +162,7 @@ lmx::elmx_error c_CT_AutoFilter::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -220,7 +220,7 @@ lmx::elmx_error c_CT_AutoFilter::marshal(lmx::c_xml_writer& writer, const char* 
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_ref) put_attribute(writer, "ref", m_ref);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_filterColumn) {
         cursor.next_known();
@@ -269,7 +269,6 @@ lmx::elmx_error c_CT_ColorFilter::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -331,7 +330,6 @@ lmx::elmx_error c_CT_CustomFilter::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -388,7 +386,7 @@ lmx::elmx_error c_CT_CustomFilters::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -432,7 +430,7 @@ lmx::elmx_error c_CT_CustomFilters::marshal(lmx::c_xml_writer& writer, const cha
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_and) put_attribute(writer, "and", m_and);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_customFilter) {
         cursor.next_known();
@@ -498,7 +496,6 @@ lmx::elmx_error c_CT_DateGroupItem::unmarshal(lmx::c_xml_reader& reader, const s
     if (!m_has_year) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "year", __LINE__);
     if (!m_has_dateTimeGrouping) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "dateTimeGrouping", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -581,7 +578,6 @@ lmx::elmx_error c_CT_DynamicFilter::unmarshal(lmx::c_xml_reader& reader, const s
     }
     if (!m_has_type) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "type", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -641,7 +637,6 @@ lmx::elmx_error c_CT_Extension::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -692,7 +687,7 @@ lmx::elmx_error c_CT_ExtensionList::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -733,7 +728,7 @@ lmx::elmx_error c_CT_ExtensionList::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_ext) {
         cursor.next_known();
@@ -767,7 +762,6 @@ lmx::elmx_error c_CT_Filter::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -834,7 +828,7 @@ lmx::elmx_error c_CT_FilterColumn::unmarshal(lmx::c_xml_reader& reader, const st
     }
     if (!m_has_colId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "colId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -926,7 +920,7 @@ lmx::elmx_error c_CT_FilterColumn::marshal(lmx::c_xml_writer& writer, const char
     if (m_has_hiddenButton) put_attribute(writer, "hiddenButton", m_hiddenButton);
     if (m_has_showButton) put_attribute(writer, "showButton", m_showButton);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_filters) {
         cursor.next_known();
@@ -995,7 +989,7 @@ lmx::elmx_error c_CT_Filters::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1046,7 +1040,7 @@ lmx::elmx_error c_CT_Filters::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_has_blank) put_attribute(writer, "blank", m_blank);
     if (m_has_calendarType) writer.attribute("calendarType", std::string_view(enum_text(k_enum_ST_CalendarType, 14, m_calendarType)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_filter) {
         cursor.next_known();
@@ -1091,7 +1085,6 @@ lmx::elmx_error c_CT_IconFilter::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_iconSet) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "iconSet", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1179,7 +1172,6 @@ lmx::elmx_error c_CT_SortCondition::unmarshal(lmx::c_xml_reader& reader, const s
     }
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1257,7 +1249,7 @@ lmx::elmx_error c_CT_SortState::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1310,7 +1302,7 @@ lmx::elmx_error c_CT_SortState::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_sortMethod) writer.attribute("sortMethod", std::string_view(enum_text(k_enum_ST_SortMethod, 3, m_sortMethod)));
     put_attribute(writer, "ref", m_ref);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_sortCondition) {
         cursor.next_known();
@@ -1461,7 +1453,7 @@ lmx::elmx_error c_CT_Table::unmarshal(lmx::c_xml_reader& reader, const std::stri
     if (!m_has_displayName) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "displayName", __LINE__);
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1558,7 +1550,7 @@ lmx::elmx_error c_CT_Table::marshal(lmx::c_xml_writer& writer, const char* name)
     if (m_has_totalsRowCellStyle) put_attribute(writer, "totalsRowCellStyle", m_totalsRowCellStyle);
     if (m_has_connectionId) put_integer_attribute(writer, "connectionId", m_connectionId);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_autoFilter) {
         cursor.next_known();
@@ -1669,7 +1661,7 @@ lmx::elmx_error c_CT_TableColumn::unmarshal(lmx::c_xml_reader& reader, const std
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     if (!m_has_name) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "name", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1746,7 +1738,7 @@ lmx::elmx_error c_CT_TableColumn::marshal(lmx::c_xml_writer& writer, const char*
     if (m_has_dataCellStyle) put_attribute(writer, "dataCellStyle", m_dataCellStyle);
     if (m_has_totalsRowCellStyle) put_attribute(writer, "totalsRowCellStyle", m_totalsRowCellStyle);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_calculatedColumnFormula) {
         cursor.next_known();
@@ -1795,7 +1787,7 @@ lmx::elmx_error c_CT_TableColumns::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1839,7 +1831,7 @@ lmx::elmx_error c_CT_TableColumns::marshal(lmx::c_xml_writer& writer, const char
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_tableColumn) {
         cursor.next_known();
@@ -1938,7 +1930,6 @@ lmx::elmx_error c_CT_TableStyleInfo::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2014,7 +2005,6 @@ lmx::elmx_error c_CT_Top10::unmarshal(lmx::c_xml_reader& reader, const std::stri
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2091,7 +2081,7 @@ lmx::elmx_error c_CT_XmlColumnPr::unmarshal(lmx::c_xml_reader& reader, const std
     if (!m_has_xpath) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "xpath", __LINE__);
     if (!m_has_xmlDataType) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "xmlDataType", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2136,7 +2126,7 @@ lmx::elmx_error c_CT_XmlColumnPr::marshal(lmx::c_xml_writer& writer, const char*
     if (m_has_denormalized) put_attribute(writer, "denormalized", m_denormalized);
     put_attribute(writer, "xmlDataType", m_xmlDataType);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_extLst) {
         cursor.next_known();

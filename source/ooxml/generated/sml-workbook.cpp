@@ -294,7 +294,7 @@ lmx::elmx_error c_CT_BookView::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -348,7 +348,7 @@ lmx::elmx_error c_CT_BookView::marshal(lmx::c_xml_writer& writer, const char* na
     if (m_has_activeTab) put_integer_attribute(writer, "activeTab", m_activeTab);
     if (m_has_autoFilterDateGrouping) put_attribute(writer, "autoFilterDateGrouping", m_autoFilterDateGrouping);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_extLst) {
         cursor.next_known();
@@ -377,7 +377,7 @@ lmx::elmx_error c_CT_BookViews::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -420,7 +420,7 @@ lmx::elmx_error c_CT_BookViews::marshal(lmx::c_xml_writer& writer, const char* n
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_workbookView) {
         cursor.next_known();
@@ -514,7 +514,6 @@ lmx::elmx_error c_CT_CalcPr::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -702,7 +701,7 @@ lmx::elmx_error c_CT_CustomWorkbookView::unmarshal(lmx::c_xml_reader& reader, co
     if (!m_has_windowHeight) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "windowHeight", __LINE__);
     if (!m_has_activeSheetId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "activeSheetId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -767,7 +766,7 @@ lmx::elmx_error c_CT_CustomWorkbookView::marshal(lmx::c_xml_writer& writer, cons
     if (m_has_showComments) writer.attribute("showComments", std::string_view(enum_text(k_enum_ST_Comments, 3, m_showComments)));
     if (m_has_showObjects) writer.attribute("showObjects", std::string_view(enum_text(k_enum_ST_Objects, 3, m_showObjects)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_extLst) {
         cursor.next_known();
@@ -796,7 +795,7 @@ lmx::elmx_error c_CT_CustomWorkbookViews::unmarshal(lmx::c_xml_reader& reader, c
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -839,7 +838,7 @@ lmx::elmx_error c_CT_CustomWorkbookViews::marshal(lmx::c_xml_writer& writer, con
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_customWorkbookView) {
         cursor.next_known();
@@ -998,7 +997,7 @@ lmx::elmx_error c_CT_DefinedNames::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1039,7 +1038,7 @@ lmx::elmx_error c_CT_DefinedNames::marshal(lmx::c_xml_writer& writer, const char
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_definedName) {
         cursor.next_known();
@@ -1073,7 +1072,6 @@ lmx::elmx_error c_CT_Extension::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1124,7 +1122,7 @@ lmx::elmx_error c_CT_ExtensionList::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1165,7 +1163,7 @@ lmx::elmx_error c_CT_ExtensionList::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_ext) {
         cursor.next_known();
@@ -1200,7 +1198,6 @@ lmx::elmx_error c_CT_ExternalReference::unmarshal(lmx::c_xml_reader& reader, con
     }
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1251,7 +1248,7 @@ lmx::elmx_error c_CT_ExternalReferences::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1294,7 +1291,7 @@ lmx::elmx_error c_CT_ExternalReferences::marshal(lmx::c_xml_writer& writer, cons
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_externalReference) {
         cursor.next_known();
@@ -1343,7 +1340,6 @@ lmx::elmx_error c_CT_FileRecoveryPr::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1432,7 +1428,6 @@ lmx::elmx_error c_CT_FileSharing::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1514,7 +1509,6 @@ lmx::elmx_error c_CT_FileVersion::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1574,7 +1568,6 @@ lmx::elmx_error c_CT_FunctionGroup::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1630,7 +1623,7 @@ lmx::elmx_error c_CT_FunctionGroups::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1672,7 +1665,7 @@ lmx::elmx_error c_CT_FunctionGroups::marshal(lmx::c_xml_writer& writer, const ch
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_builtInGroupCount) put_integer_attribute(writer, "builtInGroupCount", m_builtInGroupCount);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_functionGroup) {
         cursor.next_known();
@@ -1707,7 +1700,6 @@ lmx::elmx_error c_CT_OleSize::unmarshal(lmx::c_xml_reader& reader, const std::st
     }
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1770,7 +1762,6 @@ lmx::elmx_error c_CT_PivotCache::unmarshal(lmx::c_xml_reader& reader, const std:
     if (!m_has_cacheId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "cacheId", __LINE__);
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1822,7 +1813,7 @@ lmx::elmx_error c_CT_PivotCaches::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1865,7 +1856,7 @@ lmx::elmx_error c_CT_PivotCaches::marshal(lmx::c_xml_writer& writer, const char*
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_pivotCache) {
         cursor.next_known();
@@ -1917,7 +1908,6 @@ lmx::elmx_error c_CT_Sheet::unmarshal(lmx::c_xml_reader& reader, const std::stri
     if (!m_has_sheetId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sheetId", __LINE__);
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1971,7 +1961,7 @@ lmx::elmx_error c_CT_Sheets::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2014,7 +2004,7 @@ lmx::elmx_error c_CT_Sheets::marshal(lmx::c_xml_writer& writer, const char* name
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_sheet) {
         cursor.next_known();
@@ -2053,7 +2043,6 @@ lmx::elmx_error c_CT_SmartTagPr::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2120,7 +2109,6 @@ lmx::elmx_error c_CT_SmartTagType::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2173,7 +2161,7 @@ lmx::elmx_error c_CT_SmartTagTypes::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2214,7 +2202,7 @@ lmx::elmx_error c_CT_SmartTagTypes::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_smartTagType) {
         cursor.next_known();
@@ -2276,7 +2264,6 @@ lmx::elmx_error c_CT_WebPublishObject::unmarshal(lmx::c_xml_reader& reader, cons
     if (!m_has_divId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "divId", __LINE__);
     if (!m_has_destinationFile) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "destinationFile", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2337,7 +2324,7 @@ lmx::elmx_error c_CT_WebPublishObjects::unmarshal(lmx::c_xml_reader& reader, con
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2381,7 +2368,7 @@ lmx::elmx_error c_CT_WebPublishObjects::marshal(lmx::c_xml_writer& writer, const
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_webPublishObject) {
         cursor.next_known();
@@ -2455,7 +2442,6 @@ lmx::elmx_error c_CT_WebPublishing::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2523,7 +2509,7 @@ lmx::elmx_error c_CT_Workbook::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2711,7 +2697,7 @@ lmx::elmx_error c_CT_Workbook::marshal(lmx::c_xml_writer& writer, const char* na
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_conformance) writer.attribute("conformance", std::string_view(enum_text(k_enum_ST_ConformanceClass, 2, m_conformance)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_fileVersion) {
         cursor.next_known();
@@ -2920,7 +2906,6 @@ lmx::elmx_error c_CT_WorkbookPr::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3063,7 +3048,6 @@ lmx::elmx_error c_CT_WorkbookProtection::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);

@@ -843,7 +843,7 @@ lmx::elmx_error c_CT_Authors::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -890,7 +890,6 @@ lmx::elmx_error c_CT_Authors::marshal(lmx::c_xml_writer& writer, const char* nam
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_author) {
         cursor.next_known();
@@ -925,7 +924,7 @@ lmx::elmx_error c_CT_AutoFilter::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -983,7 +982,7 @@ lmx::elmx_error c_CT_AutoFilter::marshal(lmx::c_xml_writer& writer, const char* 
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_ref) put_attribute(writer, "ref", m_ref);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_filterColumn) {
         cursor.next_known();
@@ -1087,7 +1086,7 @@ lmx::elmx_error c_CT_BookView::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1141,7 +1140,7 @@ lmx::elmx_error c_CT_BookView::marshal(lmx::c_xml_writer& writer, const char* na
     if (m_has_activeTab) put_integer_attribute(writer, "activeTab", m_activeTab);
     if (m_has_autoFilterDateGrouping) put_attribute(writer, "autoFilterDateGrouping", m_autoFilterDateGrouping);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_extLst) {
         cursor.next_known();
@@ -1170,7 +1169,7 @@ lmx::elmx_error c_CT_BookViews::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1213,7 +1212,7 @@ lmx::elmx_error c_CT_BookViews::marshal(lmx::c_xml_writer& writer, const char* n
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_workbookView) {
         cursor.next_known();
@@ -1247,7 +1246,6 @@ lmx::elmx_error c_CT_BooleanProperty::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1313,7 +1311,7 @@ lmx::elmx_error c_CT_Border::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1421,7 +1419,7 @@ lmx::elmx_error c_CT_Border::marshal(lmx::c_xml_writer& writer, const char* name
     if (m_has_diagonalDown) put_attribute(writer, "diagonalDown", m_diagonalDown);
     if (m_has_outline) put_attribute(writer, "outline", m_outline);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_start) {
         cursor.next_known();
@@ -1495,7 +1493,7 @@ lmx::elmx_error c_CT_BorderPr::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1537,7 +1535,7 @@ lmx::elmx_error c_CT_BorderPr::marshal(lmx::c_xml_writer& writer, const char* na
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_style) writer.attribute("style", std::string_view(enum_text(k_enum_ST_BorderStyle, 14, m_style)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_color) {
         cursor.next_known();
@@ -1571,7 +1569,7 @@ lmx::elmx_error c_CT_Borders::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1613,7 +1611,7 @@ lmx::elmx_error c_CT_Borders::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_border) {
         cursor.next_known();
@@ -1667,7 +1665,6 @@ lmx::elmx_error c_CT_Break::unmarshal(lmx::c_xml_reader& reader, const std::stri
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1787,7 +1784,6 @@ lmx::elmx_error c_CT_CalcPr::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1880,7 +1876,7 @@ lmx::elmx_error c_CT_Cell::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1958,7 +1954,7 @@ lmx::elmx_error c_CT_Cell::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (m_has_vm) put_integer_attribute(writer, "vm", m_vm);
     if (m_has_ph) put_attribute(writer, "ph", m_ph);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_f) {
         cursor.next_known();
@@ -2048,7 +2044,6 @@ lmx::elmx_error c_CT_CellAlignment::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2228,7 +2223,6 @@ lmx::elmx_error c_CT_CellProtection::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2296,7 +2290,7 @@ lmx::elmx_error c_CT_CellSmartTag::unmarshal(lmx::c_xml_reader& reader, const st
     }
     if (!m_has_type) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "type", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2340,7 +2334,7 @@ lmx::elmx_error c_CT_CellSmartTag::marshal(lmx::c_xml_writer& writer, const char
     if (m_has_deleted) put_attribute(writer, "deleted", m_deleted);
     if (m_has_xmlBased) put_attribute(writer, "xmlBased", m_xmlBased);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cellSmartTagPr) {
         cursor.next_known();
@@ -2381,7 +2375,6 @@ lmx::elmx_error c_CT_CellSmartTagPr::unmarshal(lmx::c_xml_reader& reader, const 
     if (!m_has_key) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "key", __LINE__);
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2439,7 +2432,7 @@ lmx::elmx_error c_CT_CellSmartTags::unmarshal(lmx::c_xml_reader& reader, const s
     }
     if (!m_has_r) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "r", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2483,7 +2476,7 @@ lmx::elmx_error c_CT_CellSmartTags::marshal(lmx::c_xml_writer& writer, const cha
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     put_attribute(writer, "r", m_r);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cellSmartTag) {
         cursor.next_known();
@@ -2543,7 +2536,7 @@ lmx::elmx_error c_CT_CellStyle::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_xfId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "xfId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2590,7 +2583,7 @@ lmx::elmx_error c_CT_CellStyle::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_hidden) put_attribute(writer, "hidden", m_hidden);
     if (m_has_customBuiltin) put_attribute(writer, "customBuiltin", m_customBuiltin);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_extLst) {
         cursor.next_known();
@@ -2624,7 +2617,7 @@ lmx::elmx_error c_CT_CellStyleXfs::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2668,7 +2661,7 @@ lmx::elmx_error c_CT_CellStyleXfs::marshal(lmx::c_xml_writer& writer, const char
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_xf) {
         cursor.next_known();
@@ -2702,7 +2695,7 @@ lmx::elmx_error c_CT_CellStyles::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2746,7 +2739,7 @@ lmx::elmx_error c_CT_CellStyles::marshal(lmx::c_xml_writer& writer, const char* 
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cellStyle) {
         cursor.next_known();
@@ -2781,7 +2774,6 @@ lmx::elmx_error c_CT_CellWatch::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_r) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "r", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2832,7 +2824,7 @@ lmx::elmx_error c_CT_CellWatches::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2875,7 +2867,7 @@ lmx::elmx_error c_CT_CellWatches::marshal(lmx::c_xml_writer& writer, const char*
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cellWatch) {
         cursor.next_known();
@@ -2909,7 +2901,7 @@ lmx::elmx_error c_CT_CellXfs::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2953,7 +2945,7 @@ lmx::elmx_error c_CT_CellXfs::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_xf) {
         cursor.next_known();
@@ -3048,7 +3040,7 @@ lmx::elmx_error c_CT_CfRule::unmarshal(lmx::c_xml_reader& reader, const std::str
     }
     if (!m_has_priority) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "priority", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3140,7 +3132,7 @@ lmx::elmx_error c_CT_CfRule::marshal(lmx::c_xml_writer& writer, const char* name
     if (m_has_stdDev) put_integer_attribute(writer, "stdDev", m_stdDev);
     if (m_has_equalAverage) put_attribute(writer, "equalAverage", m_equalAverage);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_formula) {
         cursor.next_known();
@@ -3206,7 +3198,7 @@ lmx::elmx_error c_CT_Cfvo::unmarshal(lmx::c_xml_reader& reader, const std::strin
     }
     if (!m_has_type) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "type", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3250,7 +3242,7 @@ lmx::elmx_error c_CT_Cfvo::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (m_has_val) put_attribute(writer, "val", m_val);
     if (m_has_gte) put_attribute(writer, "gte", m_gte);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_extLst) {
         cursor.next_known();
@@ -3331,7 +3323,6 @@ lmx::elmx_error c_CT_Col::unmarshal(lmx::c_xml_reader& reader, const std::string
     if (!m_has_min) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "min", __LINE__);
     if (!m_has_max) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "max", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3416,7 +3407,6 @@ lmx::elmx_error c_CT_Color::unmarshal(lmx::c_xml_reader& reader, const std::stri
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3481,7 +3471,6 @@ lmx::elmx_error c_CT_ColorFilter::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3533,7 +3522,7 @@ lmx::elmx_error c_CT_ColorScale::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3586,7 +3575,7 @@ lmx::elmx_error c_CT_ColorScale::marshal(lmx::c_xml_writer& writer, const char* 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cfvo) {
         cursor.next_known();
@@ -3620,7 +3609,7 @@ lmx::elmx_error c_CT_Colors::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3669,7 +3658,7 @@ lmx::elmx_error c_CT_Colors::marshal(lmx::c_xml_writer& writer, const char* name
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_indexedColors) {
         cursor.next_known();
@@ -3703,7 +3692,7 @@ lmx::elmx_error c_CT_Cols::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3746,7 +3735,7 @@ lmx::elmx_error c_CT_Cols::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_col) {
         cursor.next_known();
@@ -3797,7 +3786,7 @@ lmx::elmx_error c_CT_Comment::unmarshal(lmx::c_xml_reader& reader, const std::st
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     if (!m_has_authorId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "authorId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3852,7 +3841,7 @@ lmx::elmx_error c_CT_Comment::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_has_guid) put_attribute(writer, "guid", m_guid);
     if (m_has_shapeId) put_integer_attribute(writer, "shapeId", m_shapeId);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_text) {
         cursor.next_known();
@@ -3886,7 +3875,7 @@ lmx::elmx_error c_CT_CommentList::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3927,7 +3916,7 @@ lmx::elmx_error c_CT_CommentList::marshal(lmx::c_xml_writer& writer, const char*
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_comment) {
         cursor.next_known();
@@ -4016,7 +4005,7 @@ lmx::elmx_error c_CT_CommentPr::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4071,7 +4060,7 @@ lmx::elmx_error c_CT_CommentPr::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_justLastX) put_attribute(writer, "justLastX", m_justLastX);
     if (m_has_autoScale) put_attribute(writer, "autoScale", m_autoScale);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_anchor) {
         cursor.next_known();
@@ -4104,7 +4093,7 @@ lmx::elmx_error c_CT_Comments::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4165,7 +4154,7 @@ lmx::elmx_error c_CT_Comments::marshal(lmx::c_xml_writer& writer, const char* na
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_authors) {
         cursor.next_known();
@@ -4214,7 +4203,7 @@ lmx::elmx_error c_CT_ConditionalFormatting::unmarshal(lmx::c_xml_reader& reader,
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4267,7 +4256,7 @@ lmx::elmx_error c_CT_ConditionalFormatting::marshal(lmx::c_xml_writer& writer, c
     if (m_has_pivot) put_attribute(writer, "pivot", m_pivot);
     if (m_has_sqref) put_attribute(writer, "sqref", m_sqref);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cfRule) {
         cursor.next_known();

@@ -60,7 +60,7 @@ lmx::elmx_error c_CT_Control::unmarshal(lmx::c_xml_reader& reader, const std::st
     if (!m_has_shapeId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "shapeId", __LINE__);
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -104,7 +104,7 @@ lmx::elmx_error c_CT_Control::marshal(lmx::c_xml_writer& writer, const char* nam
     put_attribute(writer, "r:id", m_id);
     if (m_has_name) put_attribute(writer, "name", m_name);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_controlPr) {
         cursor.next_known();
@@ -208,7 +208,7 @@ lmx::elmx_error c_CT_ControlPr::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -266,7 +266,7 @@ lmx::elmx_error c_CT_ControlPr::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_cf) put_attribute(writer, "cf", m_cf);
     if (m_has_id) put_attribute(writer, "r:id", m_id);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_anchor) {
         cursor.next_known();
@@ -295,7 +295,7 @@ lmx::elmx_error c_CT_Controls::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -338,7 +338,7 @@ lmx::elmx_error c_CT_Controls::marshal(lmx::c_xml_writer& writer, const char* na
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_control) {
         cursor.next_known();
@@ -377,7 +377,6 @@ lmx::elmx_error c_CT_CustomFilter::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -434,7 +433,7 @@ lmx::elmx_error c_CT_CustomFilters::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -478,7 +477,7 @@ lmx::elmx_error c_CT_CustomFilters::marshal(lmx::c_xml_writer& writer, const cha
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_and) put_attribute(writer, "and", m_and);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_customFilter) {
         cursor.next_known();
@@ -507,7 +506,7 @@ lmx::elmx_error c_CT_CustomProperties::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -550,7 +549,7 @@ lmx::elmx_error c_CT_CustomProperties::marshal(lmx::c_xml_writer& writer, const 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_customPr) {
         cursor.next_known();
@@ -591,7 +590,6 @@ lmx::elmx_error c_CT_CustomProperty::unmarshal(lmx::c_xml_reader& reader, const 
     if (!m_has_name) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "name", __LINE__);
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -744,7 +742,7 @@ lmx::elmx_error c_CT_CustomSheetView::unmarshal(lmx::c_xml_reader& reader, const
     }
     if (!m_has_guid) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "guid", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -877,7 +875,7 @@ lmx::elmx_error c_CT_CustomSheetView::marshal(lmx::c_xml_writer& writer, const c
     if (m_has_showRuler) put_attribute(writer, "showRuler", m_showRuler);
     if (m_has_topLeftCell) put_attribute(writer, "topLeftCell", m_topLeftCell);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_pane) {
         cursor.next_known();
@@ -951,7 +949,7 @@ lmx::elmx_error c_CT_CustomSheetViews::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -994,7 +992,7 @@ lmx::elmx_error c_CT_CustomSheetViews::marshal(lmx::c_xml_writer& writer, const 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_customSheetView) {
         cursor.next_known();
@@ -1148,7 +1146,7 @@ lmx::elmx_error c_CT_CustomWorkbookView::unmarshal(lmx::c_xml_reader& reader, co
     if (!m_has_windowHeight) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "windowHeight", __LINE__);
     if (!m_has_activeSheetId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "activeSheetId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1213,7 +1211,7 @@ lmx::elmx_error c_CT_CustomWorkbookView::marshal(lmx::c_xml_writer& writer, cons
     if (m_has_showComments) writer.attribute("showComments", std::string_view(enum_text(k_enum_ST_Comments, 3, m_showComments)));
     if (m_has_showObjects) writer.attribute("showObjects", std::string_view(enum_text(k_enum_ST_Objects, 3, m_showObjects)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_extLst) {
         cursor.next_known();
@@ -1242,7 +1240,7 @@ lmx::elmx_error c_CT_CustomWorkbookViews::unmarshal(lmx::c_xml_reader& reader, c
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1285,7 +1283,7 @@ lmx::elmx_error c_CT_CustomWorkbookViews::marshal(lmx::c_xml_writer& writer, con
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_customWorkbookView) {
         cursor.next_known();
@@ -1329,7 +1327,7 @@ lmx::elmx_error c_CT_DataBar::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1385,7 +1383,7 @@ lmx::elmx_error c_CT_DataBar::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_has_maxLength) put_integer_attribute(writer, "maxLength", m_maxLength);
     if (m_has_showValue) put_attribute(writer, "showValue", m_showValue);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cfvo) {
         cursor.next_known();
@@ -1444,7 +1442,7 @@ lmx::elmx_error c_CT_DataConsolidate::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1490,7 +1488,7 @@ lmx::elmx_error c_CT_DataConsolidate::marshal(lmx::c_xml_writer& writer, const c
     if (m_has_topLabels) put_attribute(writer, "topLabels", m_topLabels);
     if (m_has_link) put_attribute(writer, "link", m_link);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_dataRefs) {
         cursor.next_known();
@@ -1539,7 +1537,6 @@ lmx::elmx_error c_CT_DataRef::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1598,7 +1595,7 @@ lmx::elmx_error c_CT_DataRefs::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1640,7 +1637,7 @@ lmx::elmx_error c_CT_DataRefs::marshal(lmx::c_xml_writer& writer, const char* na
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_dataRef) {
         cursor.next_known();
@@ -1735,7 +1732,7 @@ lmx::elmx_error c_CT_DataValidation::unmarshal(lmx::c_xml_reader& reader, const 
     }
     if (!m_has_sqref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sqref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1811,7 +1808,6 @@ lmx::elmx_error c_CT_DataValidation::marshal(lmx::c_xml_writer& writer, const ch
     if (m_has_prompt) put_attribute(writer, "prompt", m_prompt);
     put_attribute(writer, "sqref", m_sqref);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_has_formula1) {
         cursor.next_known();
@@ -1867,7 +1863,7 @@ lmx::elmx_error c_CT_DataValidations::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1914,7 +1910,7 @@ lmx::elmx_error c_CT_DataValidations::marshal(lmx::c_xml_writer& writer, const c
     if (m_has_yWindow) put_integer_attribute(writer, "yWindow", m_yWindow);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_dataValidation) {
         cursor.next_known();
@@ -1980,7 +1976,6 @@ lmx::elmx_error c_CT_DateGroupItem::unmarshal(lmx::c_xml_reader& reader, const s
     if (!m_has_year) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "year", __LINE__);
     if (!m_has_dateTimeGrouping) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "dateTimeGrouping", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2167,7 +2162,7 @@ lmx::elmx_error c_CT_DefinedNames::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2208,7 +2203,7 @@ lmx::elmx_error c_CT_DefinedNames::marshal(lmx::c_xml_writer& writer, const char
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_definedName) {
         cursor.next_known();
@@ -2243,7 +2238,6 @@ lmx::elmx_error c_CT_Drawing::unmarshal(lmx::c_xml_reader& reader, const std::st
     }
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2390,7 +2384,6 @@ lmx::elmx_error c_CT_DrawingHF::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2459,7 +2452,7 @@ lmx::elmx_error c_CT_Dxf::unmarshal(lmx::c_xml_reader& reader, const std::string
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2548,7 +2541,7 @@ lmx::elmx_error c_CT_Dxf::marshal(lmx::c_xml_writer& writer, const char* name) c
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_font) {
         cursor.next_known();
@@ -2612,7 +2605,7 @@ lmx::elmx_error c_CT_Dxfs::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2654,7 +2647,7 @@ lmx::elmx_error c_CT_Dxfs::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_dxf) {
         cursor.next_known();
@@ -2709,7 +2702,6 @@ lmx::elmx_error c_CT_DynamicFilter::unmarshal(lmx::c_xml_reader& reader, const s
     }
     if (!m_has_type) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "type", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2769,7 +2761,6 @@ lmx::elmx_error c_CT_Extension::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2820,7 +2811,7 @@ lmx::elmx_error c_CT_ExtensionList::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2861,7 +2852,7 @@ lmx::elmx_error c_CT_ExtensionList::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_ext) {
         cursor.next_known();
@@ -2896,7 +2887,6 @@ lmx::elmx_error c_CT_ExternalReference::unmarshal(lmx::c_xml_reader& reader, con
     }
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2947,7 +2937,7 @@ lmx::elmx_error c_CT_ExternalReferences::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2990,7 +2980,7 @@ lmx::elmx_error c_CT_ExternalReferences::marshal(lmx::c_xml_writer& writer, cons
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_externalReference) {
         cursor.next_known();
@@ -3039,7 +3029,6 @@ lmx::elmx_error c_CT_FileRecoveryPr::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3128,7 +3117,6 @@ lmx::elmx_error c_CT_FileSharing::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3210,7 +3198,6 @@ lmx::elmx_error c_CT_FileVersion::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3265,7 +3252,7 @@ lmx::elmx_error c_CT_Fill::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3314,7 +3301,7 @@ lmx::elmx_error c_CT_Fill::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_patternFill) {
         cursor.next_known();
@@ -3353,7 +3340,7 @@ lmx::elmx_error c_CT_Fills::unmarshal(lmx::c_xml_reader& reader, const std::stri
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3395,7 +3382,7 @@ lmx::elmx_error c_CT_Fills::marshal(lmx::c_xml_writer& writer, const char* name)
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_fill) {
         cursor.next_known();
@@ -3429,7 +3416,6 @@ lmx::elmx_error c_CT_Filter::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);

@@ -59,7 +59,7 @@ lmx::elmx_error c_CT_FilterColumn::unmarshal(lmx::c_xml_reader& reader, const st
     }
     if (!m_has_colId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "colId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -151,7 +151,7 @@ lmx::elmx_error c_CT_FilterColumn::marshal(lmx::c_xml_writer& writer, const char
     if (m_has_hiddenButton) put_attribute(writer, "hiddenButton", m_hiddenButton);
     if (m_has_showButton) put_attribute(writer, "showButton", m_showButton);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_filters) {
         cursor.next_known();
@@ -220,7 +220,7 @@ lmx::elmx_error c_CT_Filters::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -271,7 +271,7 @@ lmx::elmx_error c_CT_Filters::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_has_blank) put_attribute(writer, "blank", m_blank);
     if (m_has_calendarType) writer.attribute("calendarType", std::string_view(enum_text(k_enum_ST_CalendarType, 14, m_calendarType)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_filter) {
         cursor.next_known();
@@ -305,7 +305,7 @@ lmx::elmx_error c_CT_Font::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -473,7 +473,7 @@ lmx::elmx_error c_CT_Font::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -705,7 +705,6 @@ lmx::elmx_error c_CT_FontFamily::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -762,7 +761,6 @@ lmx::elmx_error c_CT_FontName::unmarshal(lmx::c_xml_reader& reader, const std::s
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -819,7 +817,6 @@ lmx::elmx_error c_CT_FontScheme::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -876,7 +873,6 @@ lmx::elmx_error c_CT_FontSize::unmarshal(lmx::c_xml_reader& reader, const std::s
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -932,7 +928,7 @@ lmx::elmx_error c_CT_Fonts::unmarshal(lmx::c_xml_reader& reader, const std::stri
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -974,7 +970,7 @@ lmx::elmx_error c_CT_Fonts::marshal(lmx::c_xml_writer& writer, const char* name)
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_font) {
         cursor.next_known();
@@ -1008,7 +1004,6 @@ lmx::elmx_error c_CT_FunctionGroup::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1064,7 +1059,7 @@ lmx::elmx_error c_CT_FunctionGroups::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1106,7 +1101,7 @@ lmx::elmx_error c_CT_FunctionGroups::marshal(lmx::c_xml_writer& writer, const ch
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_builtInGroupCount) put_integer_attribute(writer, "builtInGroupCount", m_builtInGroupCount);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_functionGroup) {
         cursor.next_known();
@@ -1165,7 +1160,7 @@ lmx::elmx_error c_CT_GradientFill::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1212,7 +1207,7 @@ lmx::elmx_error c_CT_GradientFill::marshal(lmx::c_xml_writer& writer, const char
     if (m_has_top) put_attribute(writer, "top", m_top);
     if (m_has_bottom) put_attribute(writer, "bottom", m_bottom);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_stop) {
         cursor.next_known();
@@ -1247,7 +1242,7 @@ lmx::elmx_error c_CT_GradientStop::unmarshal(lmx::c_xml_reader& reader, const st
     }
     if (!m_has_position) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "position", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1291,7 +1286,7 @@ lmx::elmx_error c_CT_GradientStop::marshal(lmx::c_xml_writer& writer, const char
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     put_attribute(writer, "position", m_position);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_color) {
         cursor.next_known();
@@ -1340,7 +1335,7 @@ lmx::elmx_error c_CT_HeaderFooter::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1467,7 +1462,6 @@ lmx::elmx_error c_CT_HeaderFooter::marshal(lmx::c_xml_writer& writer, const char
     if (m_has_scaleWithDoc) put_attribute(writer, "scaleWithDoc", m_scaleWithDoc);
     if (m_has_alignWithMargins) put_attribute(writer, "alignWithMargins", m_alignWithMargins);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_has_oddHeader) {
         cursor.next_known();
@@ -1553,7 +1547,6 @@ lmx::elmx_error c_CT_Hyperlink::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1608,7 +1601,7 @@ lmx::elmx_error c_CT_Hyperlinks::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1651,7 +1644,7 @@ lmx::elmx_error c_CT_Hyperlinks::marshal(lmx::c_xml_writer& writer, const char* 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_hyperlink) {
         cursor.next_known();
@@ -1691,7 +1684,6 @@ lmx::elmx_error c_CT_IconFilter::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_iconSet) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "iconSet", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1763,7 +1755,7 @@ lmx::elmx_error c_CT_IconSet::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1810,7 +1802,7 @@ lmx::elmx_error c_CT_IconSet::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_has_percent) put_attribute(writer, "percent", m_percent);
     if (m_has_reverse) put_attribute(writer, "reverse", m_reverse);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cfvo) {
         cursor.next_known();
@@ -1890,7 +1882,6 @@ lmx::elmx_error c_CT_IgnoredError::unmarshal(lmx::c_xml_reader& reader, const st
     }
     if (!m_has_sqref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sqref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1950,7 +1941,7 @@ lmx::elmx_error c_CT_IgnoredErrors::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2001,7 +1992,7 @@ lmx::elmx_error c_CT_IgnoredErrors::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_ignoredError) {
         cursor.next_known();
@@ -2041,7 +2032,6 @@ lmx::elmx_error c_CT_Index::unmarshal(lmx::c_xml_reader& reader, const std::stri
     }
     if (!m_has_v) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "v", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2092,7 +2082,7 @@ lmx::elmx_error c_CT_IndexedColors::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2135,7 +2125,7 @@ lmx::elmx_error c_CT_IndexedColors::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_rgbColor) {
         cursor.next_known();
@@ -2191,7 +2181,6 @@ lmx::elmx_error c_CT_InputCells::unmarshal(lmx::c_xml_reader& reader, const std:
     if (!m_has_r) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "r", __LINE__);
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2252,7 +2241,6 @@ lmx::elmx_error c_CT_IntProperty::unmarshal(lmx::c_xml_reader& reader, const std
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2309,7 +2297,6 @@ lmx::elmx_error c_CT_LegacyDrawing::unmarshal(lmx::c_xml_reader& reader, const s
     }
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2360,7 +2347,7 @@ lmx::elmx_error c_CT_MRUColors::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2403,7 +2390,7 @@ lmx::elmx_error c_CT_MRUColors::marshal(lmx::c_xml_writer& writer, const char* n
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_color) {
         cursor.next_known();
@@ -2432,7 +2419,7 @@ lmx::elmx_error c_CT_Marker::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2533,7 +2520,6 @@ lmx::elmx_error c_CT_Marker::marshal(lmx::c_xml_writer& writer, const char* name
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_has_col) {
         cursor.next_known();
@@ -2587,7 +2573,6 @@ lmx::elmx_error c_CT_MergeCell::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2643,7 +2628,7 @@ lmx::elmx_error c_CT_MergeCells::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2687,7 +2672,7 @@ lmx::elmx_error c_CT_MergeCells::marshal(lmx::c_xml_writer& writer, const char* 
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_mergeCell) {
         cursor.next_known();
@@ -2728,7 +2713,6 @@ lmx::elmx_error c_CT_NumFmt::unmarshal(lmx::c_xml_reader& reader, const std::str
     if (!m_has_numFmtId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "numFmtId", __LINE__);
     if (!m_has_formatCode) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "formatCode", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2785,7 +2769,7 @@ lmx::elmx_error c_CT_NumFmts::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2827,7 +2811,7 @@ lmx::elmx_error c_CT_NumFmts::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_numFmt) {
         cursor.next_known();
@@ -2866,7 +2850,7 @@ lmx::elmx_error c_CT_ObjectAnchor::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2921,7 +2905,7 @@ lmx::elmx_error c_CT_ObjectAnchor::marshal(lmx::c_xml_writer& writer, const char
     if (m_has_moveWithCells) put_attribute(writer, "moveWithCells", m_moveWithCells);
     if (m_has_sizeWithCells) put_attribute(writer, "sizeWithCells", m_sizeWithCells);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_from) {
         cursor.next_known();
@@ -3015,7 +2999,7 @@ lmx::elmx_error c_CT_ObjectPr::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3070,7 +3054,7 @@ lmx::elmx_error c_CT_ObjectPr::marshal(lmx::c_xml_writer& writer, const char* na
     if (m_has_dde) put_attribute(writer, "dde", m_dde);
     if (m_has_id) put_attribute(writer, "r:id", m_id);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_anchor) {
         cursor.next_known();
@@ -3135,7 +3119,7 @@ lmx::elmx_error c_CT_OleObject::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_shapeId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "shapeId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3183,7 +3167,7 @@ lmx::elmx_error c_CT_OleObject::marshal(lmx::c_xml_writer& writer, const char* n
     put_integer_attribute(writer, "shapeId", m_shapeId);
     if (m_has_id) put_attribute(writer, "r:id", m_id);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_objectPr) {
         cursor.next_known();
@@ -3212,7 +3196,7 @@ lmx::elmx_error c_CT_OleObjects::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3255,7 +3239,7 @@ lmx::elmx_error c_CT_OleObjects::marshal(lmx::c_xml_writer& writer, const char* 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_oleObject) {
         cursor.next_known();
@@ -3290,7 +3274,6 @@ lmx::elmx_error c_CT_OleSize::unmarshal(lmx::c_xml_reader& reader, const std::st
     }
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);

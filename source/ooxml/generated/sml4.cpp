@@ -63,7 +63,6 @@ lmx::elmx_error c_CT_OutlinePr::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -127,7 +126,7 @@ lmx::elmx_error c_CT_PageBreak::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -170,7 +169,7 @@ lmx::elmx_error c_CT_PageBreak::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_has_manualBreakCount) put_integer_attribute(writer, "manualBreakCount", m_manualBreakCount);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_brk) {
         cursor.next_known();
@@ -235,7 +234,6 @@ lmx::elmx_error c_CT_PageMargins::unmarshal(lmx::c_xml_reader& reader, const std
     if (!m_has_header) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "header", __LINE__);
     if (!m_has_footer) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "footer", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -301,7 +299,6 @@ lmx::elmx_error c_CT_PageSetUpPr::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -448,7 +445,6 @@ lmx::elmx_error c_CT_PageSetup::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -542,7 +538,6 @@ lmx::elmx_error c_CT_Pane::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -602,7 +597,7 @@ lmx::elmx_error c_CT_PatternFill::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -652,7 +647,7 @@ lmx::elmx_error c_CT_PatternFill::marshal(lmx::c_xml_writer& writer, const char*
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_patternType) writer.attribute("patternType", std::string_view(enum_text(k_enum_ST_PatternType, 19, m_patternType)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_fgColor) {
         cursor.next_known();
@@ -702,7 +697,6 @@ lmx::elmx_error c_CT_PhoneticPr::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_fontId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "fontId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -767,7 +761,7 @@ lmx::elmx_error c_CT_PhoneticRun::unmarshal(lmx::c_xml_reader& reader, const std
     if (!m_has_sb) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sb", __LINE__);
     if (!m_has_eb) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "eb", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -812,7 +806,7 @@ lmx::elmx_error c_CT_PhoneticRun::marshal(lmx::c_xml_writer& writer, const char*
     put_integer_attribute(writer, "sb", m_sb);
     put_integer_attribute(writer, "eb", m_eb);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_t) {
         cursor.next_known();
@@ -901,7 +895,7 @@ lmx::elmx_error c_CT_PivotArea::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -962,7 +956,7 @@ lmx::elmx_error c_CT_PivotArea::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_axis) writer.attribute("axis", std::string_view(enum_text(k_enum_ST_Axis, 4, m_axis)));
     if (m_has_fieldPosition) put_integer_attribute(writer, "fieldPosition", m_fieldPosition);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_references) {
         cursor.next_known();
@@ -1081,7 +1075,7 @@ lmx::elmx_error c_CT_PivotAreaReference::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1147,7 +1141,7 @@ lmx::elmx_error c_CT_PivotAreaReference::marshal(lmx::c_xml_writer& writer, cons
     if (m_has_varSubtotal) put_attribute(writer, "varSubtotal", m_varSubtotal);
     if (m_has_varPSubtotal) put_attribute(writer, "varPSubtotal", m_varPSubtotal);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_x) {
         cursor.next_known();
@@ -1186,7 +1180,7 @@ lmx::elmx_error c_CT_PivotAreaReferences::unmarshal(lmx::c_xml_reader& reader, c
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1230,7 +1224,7 @@ lmx::elmx_error c_CT_PivotAreaReferences::marshal(lmx::c_xml_writer& writer, con
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_reference) {
         cursor.next_known();
@@ -1271,7 +1265,6 @@ lmx::elmx_error c_CT_PivotCache::unmarshal(lmx::c_xml_reader& reader, const std:
     if (!m_has_cacheId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "cacheId", __LINE__);
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1323,7 +1316,7 @@ lmx::elmx_error c_CT_PivotCaches::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1366,7 +1359,7 @@ lmx::elmx_error c_CT_PivotCaches::marshal(lmx::c_xml_writer& writer, const char*
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_pivotCache) {
         cursor.next_known();
@@ -1480,7 +1473,7 @@ lmx::elmx_error c_CT_PivotSelection::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1540,7 +1533,7 @@ lmx::elmx_error c_CT_PivotSelection::marshal(lmx::c_xml_writer& writer, const ch
     if (m_has_click) put_integer_attribute(writer, "click", m_click);
     if (m_has_id) put_attribute(writer, "r:id", m_id);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_pivotArea) {
         cursor.next_known();
@@ -1594,7 +1587,6 @@ lmx::elmx_error c_CT_PrintOptions::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1691,7 +1683,7 @@ lmx::elmx_error c_CT_ProtectedRange::unmarshal(lmx::c_xml_reader& reader, const 
     if (!m_has_sqref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sqref", __LINE__);
     if (!m_has_name) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "name", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1746,7 +1738,6 @@ lmx::elmx_error c_CT_ProtectedRange::marshal(lmx::c_xml_writer& writer, const ch
     if (m_has_saltValue) writer.attribute("saltValue", std::string_view(m_saltValue.to_base64()));
     if (m_has_spinCount) put_integer_attribute(writer, "spinCount", m_spinCount);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_securityDescriptor_elem) {
         cursor.next_known();
@@ -1776,7 +1767,7 @@ lmx::elmx_error c_CT_ProtectedRanges::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1819,7 +1810,7 @@ lmx::elmx_error c_CT_ProtectedRanges::marshal(lmx::c_xml_writer& writer, const c
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_protectedRange) {
         cursor.next_known();
@@ -1848,7 +1839,7 @@ lmx::elmx_error c_CT_RElt::unmarshal(lmx::c_xml_reader& reader, const std::strin
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1899,7 +1890,7 @@ lmx::elmx_error c_CT_RElt::marshal(lmx::c_xml_writer& writer, const char* name) 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_rPr) {
         cursor.next_known();
@@ -1933,7 +1924,7 @@ lmx::elmx_error c_CT_RPrElt::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2101,7 +2092,7 @@ lmx::elmx_error c_CT_RPrElt::marshal(lmx::c_xml_writer& writer, const char* name
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -2332,7 +2323,6 @@ lmx::elmx_error c_CT_RgbColor::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2443,7 +2433,7 @@ lmx::elmx_error c_CT_Row::unmarshal(lmx::c_xml_reader& reader, const std::string
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2504,7 +2494,7 @@ lmx::elmx_error c_CT_Row::marshal(lmx::c_xml_writer& writer, const char* name) c
     if (m_has_thickBot) put_attribute(writer, "thickBot", m_thickBot);
     if (m_has_ph) put_attribute(writer, "ph", m_ph);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_c) {
         cursor.next_known();
@@ -2538,7 +2528,7 @@ lmx::elmx_error c_CT_Rst::unmarshal(lmx::c_xml_reader& reader, const std::string
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2603,7 +2593,7 @@ lmx::elmx_error c_CT_Rst::marshal(lmx::c_xml_writer& writer, const char* name) c
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_t) {
         cursor.next_known();
@@ -2678,7 +2668,7 @@ lmx::elmx_error c_CT_Scenario::unmarshal(lmx::c_xml_reader& reader, const std::s
     }
     if (!m_has_name) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "name", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2727,7 +2717,7 @@ lmx::elmx_error c_CT_Scenario::marshal(lmx::c_xml_writer& writer, const char* na
     if (m_has_user) put_attribute(writer, "user", m_user);
     if (m_has_comment) put_attribute(writer, "comment", m_comment);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_inputCells) {
         cursor.next_known();
@@ -2771,7 +2761,7 @@ lmx::elmx_error c_CT_Scenarios::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2817,7 +2807,7 @@ lmx::elmx_error c_CT_Scenarios::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_show) put_integer_attribute(writer, "show", m_show);
     if (m_has_sqref) put_attribute(writer, "sqref", m_sqref);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_scenario) {
         cursor.next_known();
@@ -2866,7 +2856,6 @@ lmx::elmx_error c_CT_Selection::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2943,7 +2932,6 @@ lmx::elmx_error c_CT_Sheet::unmarshal(lmx::c_xml_reader& reader, const std::stri
     if (!m_has_sheetId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sheetId", __LINE__);
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3003,7 +2991,6 @@ lmx::elmx_error c_CT_SheetBackgroundPicture::unmarshal(lmx::c_xml_reader& reader
     }
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3059,7 +3046,6 @@ lmx::elmx_error c_CT_SheetCalcPr::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3115,7 +3101,7 @@ lmx::elmx_error c_CT_SheetData::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     std::int64_t row_number = 0;
     c_CT_Row* worker = handler ? new c_CT_Row() : nullptr;
     const quire::ooxml::c_owned<c_CT_Row> worker_owner = [&] {
@@ -3179,7 +3165,7 @@ lmx::elmx_error c_CT_SheetData::marshal(lmx::c_xml_writer& writer, const char* n
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_row) {
         cursor.next_known();
@@ -3214,7 +3200,6 @@ lmx::elmx_error c_CT_SheetDimension::unmarshal(lmx::c_xml_reader& reader, const 
     }
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3311,7 +3296,6 @@ lmx::elmx_error c_CT_SheetFormatPr::unmarshal(lmx::c_xml_reader& reader, const s
     }
     if (!m_has_defaultRowHeight) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "defaultRowHeight", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3415,7 +3399,7 @@ lmx::elmx_error c_CT_SheetPr::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3481,7 +3465,7 @@ lmx::elmx_error c_CT_SheetPr::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_has_filterMode) put_attribute(writer, "filterMode", m_filterMode);
     if (m_has_enableFormatConditionsCalculation) put_attribute(writer, "enableFormatConditionsCalculation", m_enableFormatConditionsCalculation);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_tabColor) {
         cursor.next_known();
@@ -3625,7 +3609,6 @@ lmx::elmx_error c_CT_SheetProtection::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3792,7 +3775,7 @@ lmx::elmx_error c_CT_SheetView::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_workbookViewId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "workbookViewId", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3876,7 +3859,7 @@ lmx::elmx_error c_CT_SheetView::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_zoomScalePageLayoutView) put_integer_attribute(writer, "zoomScalePageLayoutView", m_zoomScalePageLayoutView);
     put_integer_attribute(writer, "workbookViewId", m_workbookViewId);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_pane) {
         cursor.next_known();

@@ -43,7 +43,7 @@ lmx::elmx_error c_CT_SheetViews::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -94,7 +94,7 @@ lmx::elmx_error c_CT_SheetViews::marshal(lmx::c_xml_writer& writer, const char* 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_sheetView) {
         cursor.next_known();
@@ -128,7 +128,7 @@ lmx::elmx_error c_CT_Sheets::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -171,7 +171,7 @@ lmx::elmx_error c_CT_Sheets::marshal(lmx::c_xml_writer& writer, const char* name
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_sheet) {
         cursor.next_known();
@@ -210,7 +210,6 @@ lmx::elmx_error c_CT_SmartTagPr::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -277,7 +276,6 @@ lmx::elmx_error c_CT_SmartTagType::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -330,7 +328,7 @@ lmx::elmx_error c_CT_SmartTagTypes::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -371,7 +369,7 @@ lmx::elmx_error c_CT_SmartTagTypes::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_smartTagType) {
         cursor.next_known();
@@ -400,7 +398,7 @@ lmx::elmx_error c_CT_SmartTags::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -443,7 +441,7 @@ lmx::elmx_error c_CT_SmartTags::marshal(lmx::c_xml_writer& writer, const char* n
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_cellSmartTags) {
         cursor.next_known();
@@ -508,7 +506,6 @@ lmx::elmx_error c_CT_SortCondition::unmarshal(lmx::c_xml_reader& reader, const s
     }
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -586,7 +583,7 @@ lmx::elmx_error c_CT_SortState::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -639,7 +636,7 @@ lmx::elmx_error c_CT_SortState::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_sortMethod) writer.attribute("sortMethod", std::string_view(enum_text(k_enum_ST_SortMethod, 3, m_sortMethod)));
     put_attribute(writer, "ref", m_ref);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_sortCondition) {
         cursor.next_known();
@@ -687,7 +684,7 @@ lmx::elmx_error c_CT_Sst::unmarshal(lmx::c_xml_reader& reader, const std::string
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -738,7 +735,7 @@ lmx::elmx_error c_CT_Sst::marshal(lmx::c_xml_writer& writer, const char* name) c
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_has_uniqueCount) put_integer_attribute(writer, "uniqueCount", m_uniqueCount);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_si) {
         cursor.next_known();
@@ -776,7 +773,7 @@ lmx::elmx_error c_CT_Stylesheet::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -897,7 +894,7 @@ lmx::elmx_error c_CT_Stylesheet::marshal(lmx::c_xml_writer& writer, const char* 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_numFmts) {
         cursor.next_known();
@@ -1093,7 +1090,7 @@ lmx::elmx_error c_CT_Table::unmarshal(lmx::c_xml_reader& reader, const std::stri
     if (!m_has_displayName) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "displayName", __LINE__);
     if (!m_has_ref) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "ref", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1190,7 +1187,7 @@ lmx::elmx_error c_CT_Table::marshal(lmx::c_xml_writer& writer, const char* name)
     if (m_has_totalsRowCellStyle) put_attribute(writer, "totalsRowCellStyle", m_totalsRowCellStyle);
     if (m_has_connectionId) put_integer_attribute(writer, "connectionId", m_connectionId);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_autoFilter) {
         cursor.next_known();
@@ -1301,7 +1298,7 @@ lmx::elmx_error c_CT_TableColumn::unmarshal(lmx::c_xml_reader& reader, const std
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     if (!m_has_name) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "name", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1378,7 +1375,7 @@ lmx::elmx_error c_CT_TableColumn::marshal(lmx::c_xml_writer& writer, const char*
     if (m_has_dataCellStyle) put_attribute(writer, "dataCellStyle", m_dataCellStyle);
     if (m_has_totalsRowCellStyle) put_attribute(writer, "totalsRowCellStyle", m_totalsRowCellStyle);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_calculatedColumnFormula) {
         cursor.next_known();
@@ -1427,7 +1424,7 @@ lmx::elmx_error c_CT_TableColumns::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1471,7 +1468,7 @@ lmx::elmx_error c_CT_TableColumns::marshal(lmx::c_xml_writer& writer, const char
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_tableColumn) {
         cursor.next_known();
@@ -1551,7 +1548,6 @@ lmx::elmx_error c_CT_TablePart::unmarshal(lmx::c_xml_reader& reader, const std::
     }
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1607,7 +1603,7 @@ lmx::elmx_error c_CT_TableParts::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1649,7 +1645,7 @@ lmx::elmx_error c_CT_TableParts::marshal(lmx::c_xml_writer& writer, const char* 
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_tablePart) {
         cursor.next_known();
@@ -1699,7 +1695,7 @@ lmx::elmx_error c_CT_TableStyle::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_name) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "name", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1744,7 +1740,7 @@ lmx::elmx_error c_CT_TableStyle::marshal(lmx::c_xml_writer& writer, const char* 
     if (m_has_table) put_attribute(writer, "table", m_table);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_tableStyleElement) {
         cursor.next_known();
@@ -1789,7 +1785,6 @@ lmx::elmx_error c_CT_TableStyleElement::unmarshal(lmx::c_xml_reader& reader, con
     }
     if (!m_has_type) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "type", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1867,7 +1862,6 @@ lmx::elmx_error c_CT_TableStyleInfo::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1937,7 +1931,7 @@ lmx::elmx_error c_CT_TableStyles::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1981,7 +1975,7 @@ lmx::elmx_error c_CT_TableStyles::marshal(lmx::c_xml_writer& writer, const char*
     if (m_has_defaultTableStyle) put_attribute(writer, "defaultTableStyle", m_defaultTableStyle);
     if (m_has_defaultPivotStyle) put_attribute(writer, "defaultPivotStyle", m_defaultPivotStyle);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_tableStyle) {
         cursor.next_known();
@@ -2031,7 +2025,6 @@ lmx::elmx_error c_CT_Top10::unmarshal(lmx::c_xml_reader& reader, const std::stri
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2090,7 +2083,6 @@ lmx::elmx_error c_CT_UnderlineProperty::unmarshal(lmx::c_xml_reader& reader, con
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2147,7 +2139,6 @@ lmx::elmx_error c_CT_VerticalAlignFontProperty::unmarshal(lmx::c_xml_reader& rea
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2242,7 +2233,6 @@ lmx::elmx_error c_CT_WebPublishItem::unmarshal(lmx::c_xml_reader& reader, const 
     if (!m_has_sourceType) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sourceType", __LINE__);
     if (!m_has_destinationFile) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "destinationFile", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2305,7 +2295,7 @@ lmx::elmx_error c_CT_WebPublishItems::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2349,7 +2339,7 @@ lmx::elmx_error c_CT_WebPublishItems::marshal(lmx::c_xml_writer& writer, const c
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_webPublishItem) {
         cursor.next_known();
@@ -2411,7 +2401,6 @@ lmx::elmx_error c_CT_WebPublishObject::unmarshal(lmx::c_xml_reader& reader, cons
     if (!m_has_divId) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "divId", __LINE__);
     if (!m_has_destinationFile) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "destinationFile", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2472,7 +2461,7 @@ lmx::elmx_error c_CT_WebPublishObjects::unmarshal(lmx::c_xml_reader& reader, con
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2516,7 +2505,7 @@ lmx::elmx_error c_CT_WebPublishObjects::marshal(lmx::c_xml_writer& writer, const
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_count) put_integer_attribute(writer, "count", m_count);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_webPublishObject) {
         cursor.next_known();
@@ -2590,7 +2579,6 @@ lmx::elmx_error c_CT_WebPublishing::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2658,7 +2646,7 @@ lmx::elmx_error c_CT_Workbook::unmarshal(lmx::c_xml_reader& reader, const std::s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2846,7 +2834,7 @@ lmx::elmx_error c_CT_Workbook::marshal(lmx::c_xml_writer& writer, const char* na
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_conformance) writer.attribute("conformance", std::string_view(enum_text(k_enum_ST_ConformanceClass, 2, m_conformance)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_fileVersion) {
         cursor.next_known();
@@ -3055,7 +3043,6 @@ lmx::elmx_error c_CT_WorkbookPr::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3198,7 +3185,6 @@ lmx::elmx_error c_CT_WorkbookProtection::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3272,7 +3258,7 @@ lmx::elmx_error c_CT_Worksheet::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3619,7 +3605,7 @@ lmx::elmx_error c_CT_Worksheet::marshal(lmx::c_xml_writer& writer, const char* n
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_sheetPr) {
         cursor.next_known();
@@ -3903,7 +3889,7 @@ lmx::elmx_error c_CT_Xf::unmarshal(lmx::c_xml_reader& reader, const std::string&
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3973,7 +3959,7 @@ lmx::elmx_error c_CT_Xf::marshal(lmx::c_xml_writer& writer, const char* name) co
     if (m_has_applyAlignment) put_attribute(writer, "applyAlignment", m_applyAlignment);
     if (m_has_applyProtection) put_attribute(writer, "applyProtection", m_applyProtection);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_alignment) {
         cursor.next_known();
@@ -4035,7 +4021,7 @@ lmx::elmx_error c_CT_XmlColumnPr::unmarshal(lmx::c_xml_reader& reader, const std
     if (!m_has_xpath) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "xpath", __LINE__);
     if (!m_has_xmlDataType) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "xmlDataType", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4080,7 +4066,7 @@ lmx::elmx_error c_CT_XmlColumnPr::marshal(lmx::c_xml_writer& writer, const char*
     if (m_has_denormalized) put_attribute(writer, "denormalized", m_denormalized);
     put_attribute(writer, "xmlDataType", m_xmlDataType);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_extLst) {
         cursor.next_known();

@@ -43,7 +43,6 @@ lmx::elmx_error c_CT_GrayscaleEffect::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -93,7 +92,6 @@ lmx::elmx_error c_CT_GrayscaleTransform::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -143,7 +141,6 @@ lmx::elmx_error c_CT_GroupFillProperties::unmarshal(lmx::c_xml_reader& reader, c
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -228,7 +225,7 @@ lmx::elmx_error c_CT_GroupLocking::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -276,7 +273,7 @@ lmx::elmx_error c_CT_GroupLocking::marshal(lmx::c_xml_writer& writer, const char
     if (m_has_noMove) put_attribute(writer, "noMove", m_noMove);
     if (m_has_noResize) put_attribute(writer, "noResize", m_noResize);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_extLst) {
         cursor.next_known();
@@ -305,7 +302,7 @@ lmx::elmx_error c_CT_GroupShape::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -403,7 +400,7 @@ lmx::elmx_error c_CT_GroupShape::marshal(lmx::c_xml_writer& writer, const char* 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_nvGrpSpPr) {
         cursor.next_known();
@@ -509,7 +506,7 @@ lmx::elmx_error c_CT_GroupShapeNonVisual::unmarshal(lmx::c_xml_reader& reader, c
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -562,7 +559,7 @@ lmx::elmx_error c_CT_GroupShapeNonVisual::marshal(lmx::c_xml_writer& writer, con
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_cNvPr) {
         cursor.next_known();
@@ -601,7 +598,7 @@ lmx::elmx_error c_CT_GroupShapeProperties::unmarshal(lmx::c_xml_reader& reader, 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -723,7 +720,7 @@ lmx::elmx_error c_CT_GroupShapeProperties::marshal(lmx::c_xml_writer& writer, co
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_bwMode) writer.attribute("bwMode", std::string_view(enum_text(k_enum_ST_BlackWhiteMode, 11, m_bwMode)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_xfrm) {
         cursor.next_known();
@@ -817,7 +814,7 @@ lmx::elmx_error c_CT_GroupTransform2D::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -885,7 +882,7 @@ lmx::elmx_error c_CT_GroupTransform2D::marshal(lmx::c_xml_writer& writer, const 
     if (m_has_flipH) put_attribute(writer, "flipH", m_flipH);
     if (m_has_flipV) put_attribute(writer, "flipV", m_flipV);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_off) {
         cursor.next_known();
@@ -944,7 +941,6 @@ lmx::elmx_error c_CT_HSLEffect::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1015,7 +1011,7 @@ lmx::elmx_error c_CT_HslColor::unmarshal(lmx::c_xml_reader& reader, const std::s
     if (!m_has_sat) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "sat", __LINE__);
     if (!m_has_lum) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "lum", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1303,7 +1299,7 @@ lmx::elmx_error c_CT_HslColor::marshal(lmx::c_xml_writer& writer, const char* na
     put_attribute(writer, "sat", m_sat);
     put_attribute(writer, "lum", m_lum);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -1738,7 +1734,7 @@ lmx::elmx_error c_CT_Hyperlink::unmarshal(lmx::c_xml_reader& reader, const std::
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1795,7 +1791,7 @@ lmx::elmx_error c_CT_Hyperlink::marshal(lmx::c_xml_writer& writer, const char* n
     if (m_has_highlightClick) put_attribute(writer, "highlightClick", m_highlightClick);
     if (m_has_endSnd) put_attribute(writer, "endSnd", m_endSnd);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_snd) {
         cursor.next_known();
@@ -1844,7 +1840,7 @@ lmx::elmx_error c_CT_InnerShadowEffect::unmarshal(lmx::c_xml_reader& reader, con
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -1928,7 +1924,7 @@ lmx::elmx_error c_CT_InnerShadowEffect::marshal(lmx::c_xml_writer& writer, const
     if (m_has_dist) put_integer_attribute(writer, "dist", m_dist);
     if (m_has_dir) put_integer_attribute(writer, "dir", m_dir);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_scrgbClr) {
         cursor.next_known();
@@ -1982,7 +1978,6 @@ lmx::elmx_error c_CT_InverseGammaTransform::unmarshal(lmx::c_xml_reader& reader,
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2032,7 +2027,6 @@ lmx::elmx_error c_CT_InverseTransform::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2094,7 +2088,7 @@ lmx::elmx_error c_CT_LightRig::unmarshal(lmx::c_xml_reader& reader, const std::s
     if (!m_has_rig) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "rig", __LINE__);
     if (!m_has_dir) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "dir", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2137,7 +2131,7 @@ lmx::elmx_error c_CT_LightRig::marshal(lmx::c_xml_writer& writer, const char* na
     writer.attribute("rig", std::string_view(enum_text(k_enum_ST_LightRigType, 27, m_rig)));
     writer.attribute("dir", std::string_view(enum_text(k_enum_ST_LightRigDirection, 8, m_dir)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_rot) {
         cursor.next_known();
@@ -2181,7 +2175,6 @@ lmx::elmx_error c_CT_LineEndProperties::unmarshal(lmx::c_xml_reader& reader, con
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2234,7 +2227,6 @@ lmx::elmx_error c_CT_LineJoinBevel::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2289,7 +2281,6 @@ lmx::elmx_error c_CT_LineJoinMiterProperties::unmarshal(lmx::c_xml_reader& reade
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2340,7 +2331,6 @@ lmx::elmx_error c_CT_LineJoinRound::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2410,7 +2400,7 @@ lmx::elmx_error c_CT_LineProperties::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2543,7 +2533,7 @@ lmx::elmx_error c_CT_LineProperties::marshal(lmx::c_xml_writer& writer, const ch
     if (m_has_cmpd) writer.attribute("cmpd", std::string_view(enum_text(k_enum_ST_CompoundLine, 5, m_cmpd)));
     if (m_has_algn) writer.attribute("algn", std::string_view(enum_text(k_enum_ST_PenAlignment, 2, m_algn)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_noFill) {
         cursor.next_known();
@@ -2637,7 +2627,6 @@ lmx::elmx_error c_CT_LinearShadeProperties::unmarshal(lmx::c_xml_reader& reader,
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2699,7 +2688,6 @@ lmx::elmx_error c_CT_LuminanceEffect::unmarshal(lmx::c_xml_reader& reader, const
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2751,7 +2739,7 @@ lmx::elmx_error c_CT_Marker::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2852,7 +2840,6 @@ lmx::elmx_error c_CT_Marker::marshal(lmx::c_xml_writer& writer, const char* name
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_has_col) {
         cursor.next_known();
@@ -2900,7 +2887,6 @@ lmx::elmx_error c_CT_NoFillProperties::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -2950,7 +2936,7 @@ lmx::elmx_error c_CT_NonVisualConnectorProperties::unmarshal(lmx::c_xml_reader& 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3015,7 +3001,7 @@ lmx::elmx_error c_CT_NonVisualConnectorProperties::marshal(lmx::c_xml_writer& wr
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_cxnSpLocks) {
         cursor.next_known();
@@ -3086,7 +3072,7 @@ lmx::elmx_error c_CT_NonVisualDrawingProps::unmarshal(lmx::c_xml_reader& reader,
     if (!m_has_id) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "id", __LINE__);
     if (!m_has_name) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "name", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3148,7 +3134,7 @@ lmx::elmx_error c_CT_NonVisualDrawingProps::marshal(lmx::c_xml_writer& writer, c
     if (m_has_hidden) put_attribute(writer, "hidden", m_hidden);
     if (m_has_title) put_attribute(writer, "title", m_title);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_hlinkClick) {
         cursor.next_known();
@@ -3192,7 +3178,7 @@ lmx::elmx_error c_CT_NonVisualDrawingShapeProps::unmarshal(lmx::c_xml_reader& re
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3242,7 +3228,7 @@ lmx::elmx_error c_CT_NonVisualDrawingShapeProps::marshal(lmx::c_xml_writer& writ
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_txBox) put_attribute(writer, "txBox", m_txBox);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_spLocks) {
         cursor.next_known();
@@ -3276,7 +3262,7 @@ lmx::elmx_error c_CT_NonVisualGraphicFrameProperties::unmarshal(lmx::c_xml_reade
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3325,7 +3311,7 @@ lmx::elmx_error c_CT_NonVisualGraphicFrameProperties::marshal(lmx::c_xml_writer&
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_graphicFrameLocks) {
         cursor.next_known();
@@ -3359,7 +3345,7 @@ lmx::elmx_error c_CT_NonVisualGroupDrawingShapeProps::unmarshal(lmx::c_xml_reade
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3408,7 +3394,7 @@ lmx::elmx_error c_CT_NonVisualGroupDrawingShapeProps::marshal(lmx::c_xml_writer&
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_grpSpLocks) {
         cursor.next_known();
@@ -3447,7 +3433,7 @@ lmx::elmx_error c_CT_NonVisualPictureProperties::unmarshal(lmx::c_xml_reader& re
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3497,7 +3483,7 @@ lmx::elmx_error c_CT_NonVisualPictureProperties::marshal(lmx::c_xml_writer& writ
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_preferRelativeResize) put_attribute(writer, "preferRelativeResize", m_preferRelativeResize);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_picLocks) {
         cursor.next_known();
@@ -3537,7 +3523,6 @@ lmx::elmx_error c_CT_OfficeArtExtension::unmarshal(lmx::c_xml_reader& reader, co
     }
     if (!m_has_uri) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "uri", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3588,7 +3573,7 @@ lmx::elmx_error c_CT_OfficeArtExtensionList::unmarshal(lmx::c_xml_reader& reader
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3629,7 +3614,7 @@ lmx::elmx_error c_CT_OfficeArtExtensionList::marshal(lmx::c_xml_writer& writer, 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_ext) {
         cursor.next_known();
@@ -3658,7 +3643,7 @@ lmx::elmx_error c_CT_OneCellAnchor::unmarshal(lmx::c_xml_reader& reader, const s
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3769,7 +3754,7 @@ lmx::elmx_error c_CT_OneCellAnchor::marshal(lmx::c_xml_writer& writer, const cha
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_from) {
         cursor.next_known();
@@ -3883,7 +3868,7 @@ lmx::elmx_error c_CT_OuterShadowEffect::unmarshal(lmx::c_xml_reader& reader, con
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -3973,7 +3958,7 @@ lmx::elmx_error c_CT_OuterShadowEffect::marshal(lmx::c_xml_writer& writer, const
     if (m_has_algn) writer.attribute("algn", std::string_view(enum_text(k_enum_ST_RectAlignment, 9, m_algn)));
     if (m_has_rotWithShape) put_attribute(writer, "rotWithShape", m_rotWithShape);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_scrgbClr) {
         cursor.next_known();
@@ -4052,7 +4037,7 @@ lmx::elmx_error c_CT_Path2D::unmarshal(lmx::c_xml_reader& reader, const std::str
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4144,7 +4129,7 @@ lmx::elmx_error c_CT_Path2D::marshal(lmx::c_xml_writer& writer, const char* name
     if (m_has_stroke) put_attribute(writer, "stroke", m_stroke);
     if (m_has_extrusionOk) put_attribute(writer, "extrusionOk", m_extrusionOk);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -4277,7 +4262,6 @@ lmx::elmx_error c_CT_Path2DArcTo::unmarshal(lmx::c_xml_reader& reader, const std
     if (!m_has_stAng) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "stAng", __LINE__);
     if (!m_has_swAng) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "swAng", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4331,7 +4315,6 @@ lmx::elmx_error c_CT_Path2DClose::unmarshal(lmx::c_xml_reader& reader, const std
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4381,7 +4364,7 @@ lmx::elmx_error c_CT_Path2DCubicBezierTo::unmarshal(lmx::c_xml_reader& reader, c
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4424,7 +4407,7 @@ lmx::elmx_error c_CT_Path2DCubicBezierTo::marshal(lmx::c_xml_writer& writer, con
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_pt) {
         cursor.next_known();
@@ -4453,7 +4436,7 @@ lmx::elmx_error c_CT_Path2DLineTo::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4496,7 +4479,7 @@ lmx::elmx_error c_CT_Path2DLineTo::marshal(lmx::c_xml_writer& writer, const char
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_pt) {
         cursor.next_known();
@@ -4525,7 +4508,7 @@ lmx::elmx_error c_CT_Path2DList::unmarshal(lmx::c_xml_reader& reader, const std:
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4566,7 +4549,7 @@ lmx::elmx_error c_CT_Path2DList::marshal(lmx::c_xml_writer& writer, const char* 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_path) {
         cursor.next_known();
@@ -4595,7 +4578,7 @@ lmx::elmx_error c_CT_Path2DMoveTo::unmarshal(lmx::c_xml_reader& reader, const st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4638,7 +4621,7 @@ lmx::elmx_error c_CT_Path2DMoveTo::marshal(lmx::c_xml_writer& writer, const char
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_pt) {
         cursor.next_known();
@@ -4667,7 +4650,7 @@ lmx::elmx_error c_CT_Path2DQuadBezierTo::unmarshal(lmx::c_xml_reader& reader, co
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4710,7 +4693,7 @@ lmx::elmx_error c_CT_Path2DQuadBezierTo::marshal(lmx::c_xml_writer& writer, cons
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     for (const auto& item : m_pt) {
         cursor.next_known();
@@ -4744,7 +4727,7 @@ lmx::elmx_error c_CT_PathShadeProperties::unmarshal(lmx::c_xml_reader& reader, c
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4786,7 +4769,7 @@ lmx::elmx_error c_CT_PathShadeProperties::marshal(lmx::c_xml_writer& writer, con
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_path) writer.attribute("path", std::string_view(enum_text(k_enum_ST_PathShadeType, 3, m_path)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_fillToRect) {
         cursor.next_known();
@@ -4820,7 +4803,7 @@ lmx::elmx_error c_CT_PatternFillProperties::unmarshal(lmx::c_xml_reader& reader,
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4870,7 +4853,7 @@ lmx::elmx_error c_CT_PatternFillProperties::marshal(lmx::c_xml_writer& writer, c
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_has_prst) writer.attribute("prst", std::string_view(enum_text(k_enum_ST_PresetPatternVal, 54, m_prst)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_fgClr) {
         cursor.next_known();
@@ -4910,7 +4893,6 @@ lmx::elmx_error c_CT_Percentage::unmarshal(lmx::c_xml_reader& reader, const std:
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -4971,7 +4953,7 @@ lmx::elmx_error c_CT_Picture::unmarshal(lmx::c_xml_reader& reader, const std::st
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5044,7 +5026,7 @@ lmx::elmx_error c_CT_Picture::marshal(lmx::c_xml_writer& writer, const char* nam
     if (m_has_macro) put_attribute(writer, "macro", m_macro);
     if (m_has_fPublished) put_attribute(writer, "fPublished", m_fPublished);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_nvPicPr) {
         cursor.next_known();
@@ -5143,7 +5125,7 @@ lmx::elmx_error c_CT_PictureLocking::unmarshal(lmx::c_xml_reader& reader, const 
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5195,7 +5177,7 @@ lmx::elmx_error c_CT_PictureLocking::marshal(lmx::c_xml_writer& writer, const ch
     if (m_has_noChangeShapeType) put_attribute(writer, "noChangeShapeType", m_noChangeShapeType);
     if (m_has_noCrop) put_attribute(writer, "noCrop", m_noCrop);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_extLst) {
         cursor.next_known();
@@ -5224,7 +5206,7 @@ lmx::elmx_error c_CT_PictureNonVisual::unmarshal(lmx::c_xml_reader& reader, cons
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5277,7 +5259,7 @@ lmx::elmx_error c_CT_PictureNonVisual::marshal(lmx::c_xml_writer& writer, const 
     if (root) declare_namespaces(writer);
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_cNvPr) {
         cursor.next_known();
@@ -5323,7 +5305,6 @@ lmx::elmx_error c_CT_Point2D::unmarshal(lmx::c_xml_reader& reader, const std::st
     if (!m_has_x) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "x", __LINE__);
     if (!m_has_y) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "y", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5393,7 +5374,6 @@ lmx::elmx_error c_CT_Point3D::unmarshal(lmx::c_xml_reader& reader, const std::st
     if (!m_has_y) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "y", __LINE__);
     if (!m_has_z) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "z", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5476,7 +5456,7 @@ lmx::elmx_error c_CT_PolarAdjustHandle::unmarshal(lmx::c_xml_reader& reader, con
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5525,7 +5505,7 @@ lmx::elmx_error c_CT_PolarAdjustHandle::marshal(lmx::c_xml_writer& writer, const
     if (m_has_minAng) put_attribute(writer, "minAng", m_minAng);
     if (m_has_maxAng) put_attribute(writer, "maxAng", m_maxAng);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_pos) {
         cursor.next_known();
@@ -5560,7 +5540,6 @@ lmx::elmx_error c_CT_PositiveFixedAngle::unmarshal(lmx::c_xml_reader& reader, co
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5617,7 +5596,6 @@ lmx::elmx_error c_CT_PositiveFixedPercentage::unmarshal(lmx::c_xml_reader& reade
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5674,7 +5652,6 @@ lmx::elmx_error c_CT_PositivePercentage::unmarshal(lmx::c_xml_reader& reader, co
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5737,7 +5714,6 @@ lmx::elmx_error c_CT_PositiveSize2D::unmarshal(lmx::c_xml_reader& reader, const 
     if (!m_has_cx) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "cx", __LINE__);
     if (!m_has_cy) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "cy", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -5795,7 +5771,7 @@ lmx::elmx_error c_CT_PresetColor::unmarshal(lmx::c_xml_reader& reader, const std
     }
     if (!m_has_val) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "val", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6081,7 +6057,7 @@ lmx::elmx_error c_CT_PresetColor::marshal(lmx::c_xml_writer& writer, const char*
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     writer.attribute("val", std::string_view(enum_text(k_enum_ST_PresetColorVal, 190, m_val)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     {
         std::size_t next_0 = 0;
@@ -6482,7 +6458,7 @@ lmx::elmx_error c_CT_PresetGeometry2D::unmarshal(lmx::c_xml_reader& reader, cons
     }
     if (!m_has_prst) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "prst", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6524,7 +6500,7 @@ lmx::elmx_error c_CT_PresetGeometry2D::marshal(lmx::c_xml_writer& writer, const 
     if (m_foreign_) m_foreign_->write_namespaces(writer, declared);
     writer.attribute("prst", std::string_view(enum_text(k_enum_ST_ShapeType, 187, m_prst)));
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_avLst) {
         cursor.next_known();
@@ -6558,7 +6534,6 @@ lmx::elmx_error c_CT_PresetLineDashProperties::unmarshal(lmx::c_xml_reader& read
         if (result != lmx::ELMX_OK) return fail(reader, result, attribute.local_name, line);
     }
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6625,7 +6600,7 @@ lmx::elmx_error c_CT_PresetShadowEffect::unmarshal(lmx::c_xml_reader& reader, co
     }
     if (!m_has_prst) return fail(reader, lmx::ELMX_REQUIRED_ATTRIBUTES_MISSING, "prst", __LINE__);
     std::size_t known = 0;
-    [[maybe_unused]] int rank = -1;
+    int rank = -1;
     for (;;) {
         bool found = false;
         const lmx::elmx_error next = reader.next_child(found);
@@ -6709,7 +6684,7 @@ lmx::elmx_error c_CT_PresetShadowEffect::marshal(lmx::c_xml_writer& writer, cons
     if (m_has_dist) put_integer_attribute(writer, "dist", m_dist);
     if (m_has_dir) put_integer_attribute(writer, "dir", m_dir);
     if (m_foreign_) m_foreign_->write_attributes(writer);
-    [[maybe_unused]] lmx::elmx_error result = lmx::ELMX_OK;
+    lmx::elmx_error result = lmx::ELMX_OK;
     c_foreign_cursor cursor(m_foreign_.get(), writer);
     if (m_scrgbClr) {
         cursor.next_known();
