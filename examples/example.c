@@ -36,13 +36,11 @@ static void printCell(SheetHandle sheet, int row, int col) {
     }
 }
 
-int main(void) {
-    BookHandle book = qrCreateBookCW();
-    if (!book) return 1;
-
+/* The same content for both file kinds: two sheets, formats, a font and every kind of value. */
+static int fillBook(BookHandle book) {
     SheetHandle sales = qrBookAddSheetW(book, L"Sales", 0);
     SheetHandle notes = qrBookAddSheetW(book, L"Notes", 0);
-    if (!check(book, sales && notes, "adding sheets")) return 1;
+    if (!check(book, sales && notes, "adding sheets")) return 0;
 
     FormatHandle dateFormat = qrBookAddFormatW(book, 0);
     qrFormatSetNumFormatW(dateFormat, NumformatDate);
@@ -68,7 +66,10 @@ int main(void) {
     qrSheetSetColW(sales, 0, 2, 14.0, 0, 0);
     qrSheetSetMergeW(notes, 0, 0, 0, 3);
     qrSheetWriteStrW(notes, 0, 0, L"Written by the quire example", 0);
+    return 1;
+}
 
+static void printBook(BookHandle book) {
     printf("quire %X: %d sheets, %d formats, %d fonts\n", qrBookVersionW(book),
            qrBookSheetCountW(book), qrBookFormatSizeW(book), qrBookFontSizeW(book));
     for (int i = 0; i < qrBookSheetCountW(book); ++i) {
@@ -80,27 +81,54 @@ int main(void) {
             for (int col = qrSheetFirstColW(sheet); col < qrSheetLastColW(sheet); ++col)
                 printCell(sheet, row, col);
     }
-
     int year = 0, month = 0, day = 0;
-    qrBookDateUnpackW(book, qrSheetReadNumW(sales, 1, 2, 0), &year, &month, &day, 0, 0, 0, 0);
+    qrBookDateUnpackW(book, qrSheetReadNumW(qrBookGetSheetW(book, 0), 1, 2, 0), &year, &month, &day, 0, 0, 0, 0);
     printf("the date cell unpacks to %04d-%02d-%02d\n", year, month, day);
-    int ok = check(book, qrSheetWriteNumW(sales, 70000, 0, 1, 0) == 0, "refusing row 70000");
-    printf("writing row 70000 says: %s\n", qrBookErrorMessageW(book));
+}
 
-    ok = check(book, qrBookSaveW(book, L"example.xls"), "saving example.xls") && ok;
-    qrBookReleaseW(book);
-    if (!ok) return 1;
-
-    BookHandle loaded = qrCreateBookCW();
-    ok = check(loaded, qrBookLoadW(loaded, L"example.xls"), "loading example.xls");
+/* Loads a saved file with a fresh book of the same kind and prints what it holds. */
+static int loadBack(BookHandle loaded, const wchar_t* fileName) {
+    if (!loaded) return 0;
+    int ok = check(loaded, qrBookLoadW(loaded, fileName), "loading back");
     if (ok) {
         SheetHandle first = qrBookGetSheetW(loaded, 0);
         /* Each string result lives until the sheet's next one: print one at a time. */
-        printf("example.xls loaded back: %d sheets, first \"%ls\"", qrBookSheetCountW(loaded),
+        printf("%ls loaded back: %d sheets, first \"%ls\"", fileName, qrBookSheetCountW(loaded),
                qrSheetNameW(first));
         printf(", A2 = \"%ls\", B2 = %g\n", qrSheetReadStrW(first, 1, 0, 0),
                qrSheetReadNumW(first, 1, 1, 0));
+        printBook(loaded);
     }
     qrBookReleaseW(loaded);
+    return ok;
+}
+
+int main(void) {
+    /* The binary half: example.xls. */
+    BookHandle book = qrCreateBookCW();
+    if (!book) return 1;
+    if (!fillBook(book)) {
+        qrBookReleaseW(book);
+        return 1;
+    }
+    printBook(book);
+    int ok = check(book, qrSheetWriteNumW(qrBookGetSheetW(book, 0), 70000, 0, 1, 0) == 0, "refusing row 70000");
+    printf("writing row 70000 says: %s\n", qrBookErrorMessageW(book));
+    ok = check(book, qrBookSaveW(book, L"example.xls"), "saving example.xls") && ok;
+    qrBookReleaseW(book);
+    if (!ok) return 1;
+    ok = loadBack(qrCreateBookCW(), L"example.xls");
+
+    /* The Open XML half: the same content in example.xlsx. */
+    BookHandle xml = qrCreateXMLBookCW();
+    if (!xml) return 1;
+    if (!fillBook(xml)) {
+        qrBookReleaseW(xml);
+        return 1;
+    }
+    printBook(xml);
+    ok = check(xml, qrBookSaveW(xml, L"example.xlsx"), "saving example.xlsx") && ok;
+    qrBookReleaseW(xml);
+    ok = ok && loadBack(qrCreateXMLBookCW(), L"example.xlsx");
     return ok ? 0 : 1;
 }

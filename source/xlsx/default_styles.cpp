@@ -1,4 +1,4 @@
-#include "xlsx/parts.h"
+#include "xlsx/xml_styles.h"
 
 namespace quire {
 
@@ -49,9 +49,10 @@ void Styles<Tag>::makeDefault() {
     normal.set_xfId(0);
     normal.set_builtinId(0);
     cellStyles.set_count(1);
+    buildObjects();
 }
 
-template class Styles<excelNormal_tag>;
-template class Styles<excelStrict_tag>;
+template void Styles<excelNormal_tag>::makeDefault();
+template void Styles<excelStrict_tag>::makeDefault();
 
 }  // namespace quire

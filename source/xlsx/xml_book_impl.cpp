@@ -1,4 +1,6 @@
 #include "xlsx/xml_book_impl.h"
+#include "xlsx/xml_font_impl.h"
+#include "xlsx/xml_format_impl.h"
 
 #include <algorithm>
 #include <clocale>
@@ -922,44 +924,127 @@ Result XMLBookImplT<TCHAR, Tag>::unsupported(Result failure) {
 }
 
 template <class TCHAR, class Tag>
-IFormatT<TCHAR>* XMLBookImplT<TCHAR, Tag>::addFormat(IFormatT<TCHAR>*) {
-    return unsupported<IFormatT<TCHAR>*>(nullptr);
+Styles<Tag>& XMLBookImplT<TCHAR, Tag>::syncedStyles() {
+    Styles<Tag>& part = styles();
+    part.setRgbMode(rgbMode_);
+    return part;
 }
+
 template <class TCHAR, class Tag>
-IFontT<TCHAR>* XMLBookImplT<TCHAR, Tag>::addFont(IFontT<TCHAR>*) {
-    return unsupported<IFontT<TCHAR>*>(nullptr);
+IFormatT<TCHAR>* XMLBookImplT<TCHAR, Tag>::addFormat(IFormatT<TCHAR>* initFormat) {
+    return message_.guard<IFormatT<TCHAR>*>(nullptr, [&]() -> IFormatT<TCHAR>* {
+        Styles<Tag>& part = syncedStyles();
+        auto* format = part.addFormat(nullptr);
+        if (!initFormat) return format;
+        // Colours copy as stored: both books read palette indexes for the duration.
+        auto* source = dynamic_cast<IFormatPrivate<TCHAR>*>(initFormat);
+        const bool sourceRgb = source && source->rgbMode();
+        if (source) source->setRgbMode(false);
+        part.setRgbMode(false);
+        try {
+            format->copyFrom(*initFormat);
+        } catch (...) {
+            if (source) source->setRgbMode(sourceRgb);
+            part.setRgbMode(rgbMode_);
+            throw;
+        }
+        if (source) source->setRgbMode(sourceRgb);
+        part.setRgbMode(rgbMode_);
+        return format;
+    });
 }
+
 template <class TCHAR, class Tag>
-int XMLBookImplT<TCHAR, Tag>::addCustomNumFormat(const TCHAR*) {
-    return unsupported<int>(0);
+IFontT<TCHAR>* XMLBookImplT<TCHAR, Tag>::addFont(IFontT<TCHAR>* initFont) {
+    return message_.guard<IFontT<TCHAR>*>(nullptr, [&]() -> IFontT<TCHAR>* {
+        Styles<Tag>& part = syncedStyles();
+        auto* font = part.addFont();
+        if (!initFont) return font;
+        auto* source = dynamic_cast<IFontPrivate<TCHAR>*>(initFont);
+        const bool sourceRgb = source && source->rgbMode();
+        if (source) source->setRgbMode(false);
+        part.setRgbMode(false);
+        try {
+            font->copyFrom(*initFont);
+        } catch (...) {
+            if (source) source->setRgbMode(sourceRgb);
+            part.setRgbMode(rgbMode_);
+            throw;
+        }
+        if (source) source->setRgbMode(sourceRgb);
+        part.setRgbMode(rgbMode_);
+        return font;
+    });
 }
+
 template <class TCHAR, class Tag>
-const TCHAR* XMLBookImplT<TCHAR, Tag>::customNumFormat(int) {
-    return unsupported<const TCHAR*>(nullptr);
+int XMLBookImplT<TCHAR, Tag>::addCustomNumFormat(const TCHAR* customNumFormat) {
+    return message_.guard(0, [&]() -> int {
+        if (!customNumFormat) throw qrerror("custom number format can't be 0");
+        const int id = styles().addCustomNumFormat(customNumFormat);
+        if (id == 0) throw qrerror("maximum number of custom formats is exceeded");
+        return id;
+    });
 }
+
 template <class TCHAR, class Tag>
-IFormatT<TCHAR>* XMLBookImplT<TCHAR, Tag>::format(int) {
-    return unsupported<IFormatT<TCHAR>*>(nullptr);
+const TCHAR* XMLBookImplT<TCHAR, Tag>::customNumFormat(int fmt) {
+    return message_.guard(static_cast<const TCHAR*>(nullptr), [&]() -> const TCHAR* {
+        const std::wstring* text = styles().customNumFormat(fmt);
+        if (!text) throw qrerror("custom number format not found");
+        stringResult_ = *text;
+        return stringResult_.c_str();
+    });
 }
+
+template <class TCHAR, class Tag>
+IFormatT<TCHAR>* XMLBookImplT<TCHAR, Tag>::format(int index) {
+    return message_.guard<IFormatT<TCHAR>*>(nullptr, [&]() -> IFormatT<TCHAR>* {
+        if (!styles_) throw qrerror("formats are not found");
+        return syncedStyles().format(index);
+    });
+}
+
 template <class TCHAR, class Tag>
 int XMLBookImplT<TCHAR, Tag>::formatSize() {
-    return unsupported<int>(0);
+    message_.ok();
+    return styles_ ? styles_->formatCount() : 0;
 }
+
 template <class TCHAR, class Tag>
-IFontT<TCHAR>* XMLBookImplT<TCHAR, Tag>::font(int) {
-    return unsupported<IFontT<TCHAR>*>(nullptr);
+IFontT<TCHAR>* XMLBookImplT<TCHAR, Tag>::font(int index) {
+    return message_.guard<IFontT<TCHAR>*>(nullptr, [&]() -> IFontT<TCHAR>* {
+        if (!styles_) throw qrerror("fonts are not found");
+        return syncedStyles().font(index);
+    });
 }
+
 template <class TCHAR, class Tag>
 int XMLBookImplT<TCHAR, Tag>::fontSize() {
-    return unsupported<int>(0);
+    message_.ok();
+    return styles_ ? styles_->fontCount() : 0;
 }
+
 template <class TCHAR, class Tag>
-const TCHAR* XMLBookImplT<TCHAR, Tag>::defaultFont(int*) {
-    return unsupported<const TCHAR*>(nullptr);
+const TCHAR* XMLBookImplT<TCHAR, Tag>::defaultFont(int* fontSize) {
+    return message_.guard(static_cast<const TCHAR*>(nullptr), [&]() -> const TCHAR* {
+        if (!styles_ || styles_->fontCount() == 0) throw qrerror("fonts are not found");
+        auto* first = styles_->font(0);
+        if (fontSize) *fontSize = first->size();
+        stringResult_ = first->name();
+        return stringResult_.c_str();
+    });
 }
+
 template <class TCHAR, class Tag>
-void XMLBookImplT<TCHAR, Tag>::setDefaultFont(const TCHAR*, int) {
-    unsupported<int>(0);
+void XMLBookImplT<TCHAR, Tag>::setDefaultFont(const TCHAR* fontName, int fontSize) {
+    message_.guardVoid([&] {
+        if (!fontName) throw qrerror("font name can't be 0");
+        Styles<Tag>& part = styles();
+        if (part.fontCount() == 0) throw qrerror("fonts are not found");
+        part.font(0)->setSize(fontSize);
+        part.font(0)->setName(fontName);
+    });
 }
 
 // ---- Dates, colours, modes ----
@@ -1045,6 +1130,7 @@ template <class TCHAR, class Tag>
 void XMLBookImplT<TCHAR, Tag>::setRgbMode(bool rgbMode) {
     message_.ok();
     rgbMode_ = rgbMode;
+    if (styles_) styles_->setRgbMode(rgbMode);
 }
 
 template <class TCHAR, class Tag>

@@ -113,6 +113,8 @@ public:
     const std::string& workbookPartName() const { return workbookName_; }
     const std::vector<std::string>& pictureParts() const { return pictures_; }
     bool utf8Mode() const { return locale_.utf8Mode; }
+    wchar_t listSeparator() const { return locale_.listSeparator; }
+    bool usesR1C1() const { return refR1C1_; }
 
 private:
     struct LoadRequest {
@@ -136,6 +138,8 @@ private:
     int checkedSheetCount() const;
     template <class Result>
     Result unsupported(Result failure);
+    // The styles part with the book's colour mode.
+    Styles<Tag>& syncedStyles();
 
     BookMessage message_;
     std::map<std::string, XFile*> parts_;  // owns every part except the book itself

@@ -1,5 +1,7 @@
 #pragma once
 #include <string>
+#include <type_traits>
+#include <vector>
 
 #include "api/ISheetT.h"
 #include "api/book_message.h"
@@ -18,6 +20,9 @@ class XMLSheetImplT : public XmlFile<typename XmlFlavour<Tag>::Worksheet>, publi
 public:
     using Worksheet = typename XmlFlavour<Tag>::Worksheet;
     using Book = XMLBookImplT<TCHAR, Tag>;
+    using SheetData = std::remove_reference_t<decltype(std::declval<Worksheet&>().get_sheetData())>;
+    using Row = std::remove_reference_t<decltype(std::declval<SheetData&>().get_row(0))>;
+    using Cell = std::remove_reference_t<decltype(std::declval<Row&>().get_c(0))>;
 
     XMLSheetImplT();
     // A new sheet with an empty sheetData.
@@ -178,6 +183,28 @@ protected:
     lmx::elmx_error unmarshalRoot(lmx::c_xml_reader& reader) override;
 
 private:
+    // ---- The cell store over sheetData ----
+    Row* findRow(int row) const;
+    Row& rowAt(int row);
+    Cell* findCell(int row, int col) const;
+    Cell& cellAt(int row, int col, IFormatT<TCHAR>* format, bool reset);
+    Cell& existingCell(int row, int col) const;
+    void returnFormat(const Cell& cell, IFormatT<TCHAR>** format);
+    // Gives every row and cell read without a reference its position as one.
+    void numberRowsAndCells();
+    void readColumnStyles();
+    void expandSharedFormula(Cell& master, int row, int col);
+    const Cell* sharedMaster(const Cell& cell, int& masterRow, int& masterCol) const;
+    bool writeFormulaValue(int row, int col, const TCHAR* expr, IFormatT<TCHAR>* format, int kind,
+                           double number, const TCHAR* text, bool flag);
+    void refreshUsedRange();
+    int maxDigitWidth() const { return 7; }
+    int columnPadding() const;
+    template <class Cols>
+    void setColRange(Cols& cols, int first, int last, double width, int style, bool hidden);
+    void moveRows(int rowFirst, int count);
+    void moveCols(int colFirst, int count);
+
     BookMessage& message();
     int indexInBook();
     template <class Result>
@@ -185,6 +212,9 @@ private:
     void unsupported();
 
     Book* book_ = nullptr;
+    std::vector<int> colStyles_;  // default style of each column from cols; -1 none
+    bool usedStale_ = true;
+    int usedFirstRow_ = 0, usedLastRow_ = 0, usedFirstCol_ = 0, usedLastCol_ = 0;
     int firstRowLimit_ = -1;
     int lastRowLimit_ = -1;
     std::basic_string<TCHAR> stringResult_;

@@ -1,0 +1,46 @@
+#include "xlsx/xml_shared_strings.h"
+
+#include "xlsx/xstring_escape.h"
+
+namespace quire {
+
+namespace {
+constexpr std::size_t kMaxStringLength = 32767;
+}
+
+template <class Tag>
+int SharedStrings<Tag>::add(const std::wstring& text) {
+    if (text.size() > kMaxStringLength) throw qrerror("string is too long");
+    std::wstring stored = encodeXstring(text);
+    auto& table = this->document();
+    table.set_count(table.isset_count() ? table.get_count() + 1 : 1);
+    if (lastIndex_ >= 0 && !lastText_.empty() && stored == lastText_ &&
+        lastIndex_ < static_cast<int>(table.size_si()))
+        return lastIndex_;
+    auto& entry = table.append_si();
+    auto& t = entry.get_t();
+    if (!stored.empty() && (stored.front() == L' ' || stored.back() == L' ')) t.set_space(L"preserve");
+    t.set_value(stored);
+    table.set_uniqueCount(static_cast<std::uint32_t>(table.size_si()));
+    lastIndex_ = static_cast<int>(table.size_si()) - 1;
+    lastText_ = std::move(stored);
+    return lastIndex_;
+}
+
+template <class Tag>
+std::wstring SharedStrings<Tag>::get(int index) const {
+    const auto& table = this->document();
+    if (index < 0 || static_cast<std::size_t>(index) >= table.size_si())
+        throw qrerror("index is out of range or no value");
+    const auto& entry = table.get_si(static_cast<std::size_t>(index));
+    if (const auto* t = entry.find_t()) return t->get_value();
+    std::wstring text;
+    for (std::size_t i = 0; i < entry.size_r(); ++i)
+        if (const auto* t = entry.get_r(i).find_t()) text += t->get_value();
+    return text;
+}
+
+template class SharedStrings<excelNormal_tag>;
+template class SharedStrings<excelStrict_tag>;
+
+}  // namespace quire
