@@ -7,6 +7,7 @@
 
 #include "api/enums.h"
 #include "api/number_formats.h"
+#include "api/wide_text.h"
 #include "xlsx/cell_ref.h"
 #include "xlsx/xml_font_impl.h"
 #include "xlsx/xml_format_impl.h"
@@ -49,7 +50,6 @@ lmx::elmx_error XMLSheetImplT<TCHAR, Tag>::unmarshalRoot(lmx::c_xml_reader& read
     static const std::string name = "worksheet";
     const lmx::elmx_error result = this->document().unmarshal(reader, name, firstRowLimit_, lastRowLimit_);
     if (result == lmx::ELMX_OK) {
-        numberRowsAndCells();
         readColumnStyles();
         usedStale_ = true;
     }
@@ -137,24 +137,12 @@ constexpr int kMaxCol = 16383;
 enum FileCellType { kTypeBool = 0, kTypeNumber = 1, kTypeError = 2, kTypeShared = 3, kTypeStr = 4, kTypeInline = 5 };
 enum FileFormulaType { kFormulaNormal = 0, kFormulaArray = 1, kFormulaShared = 3 };
 
-int cellColumn(const std::wstring& reference) {
-    int row = 0, col = 0;
-    return parseCellRef(reference, row, col) ? col : -1;
-}
-
-std::wstring numberText(double value) {
-    char buffer[32];
+std::string_view numberText(double value, char (&buffer)[32]) {
     const auto result = std::to_chars(buffer, buffer + sizeof buffer, value, std::chars_format::general, 17);
-    return std::wstring(buffer, result.ptr);
+    return std::string_view(buffer, static_cast<std::size_t>(result.ptr - buffer));
 }
 
-bool parseNumber(const std::wstring& text, double& value) {
-    std::string narrow;
-    narrow.reserve(text.size());
-    for (wchar_t ch : text) {
-        if (ch > 127) return false;
-        narrow += static_cast<char>(ch);
-    }
+bool parseNumber(std::string_view narrow, double& value) {
     std::size_t begin = 0, end = narrow.size();
     while (begin < end && std::isspace(static_cast<unsigned char>(narrow[begin]))) ++begin;
     while (end > begin && std::isspace(static_cast<unsigned char>(narrow[end - 1]))) --end;
@@ -164,20 +152,20 @@ bool parseNumber(const std::wstring& text, double& value) {
     return result.ec == std::errc() && result.ptr == narrow.data() + end;
 }
 
-const wchar_t* errorText(int code) {
+const char* errorText(int code) {
     switch (code) {
-    case ErrorTypeNull: return L"#NULL!";
-    case ErrorTypeDiv0: return L"#DIV/0!";
-    case ErrorTypeValue: return L"#VALUE!";
-    case ErrorTypeRef: return L"#REF!";
-    case ErrorTypeName: return L"#NAME?";
-    case ErrorTypeNum: return L"#NUM!";
-    case ErrorTypeNA: return L"#N/A";
+    case ErrorTypeNull: return "#NULL!";
+    case ErrorTypeDiv0: return "#DIV/0!";
+    case ErrorTypeValue: return "#VALUE!";
+    case ErrorTypeRef: return "#REF!";
+    case ErrorTypeName: return "#NAME?";
+    case ErrorTypeNum: return "#NUM!";
+    case ErrorTypeNA: return "#N/A";
     default: return nullptr;
     }
 }
 
-int errorCode(const std::wstring& text) {
+int errorCode(std::string_view text) {
     for (int code : {ErrorTypeNull, ErrorTypeDiv0, ErrorTypeValue, ErrorTypeRef, ErrorTypeName, ErrorTypeNum, ErrorTypeNA})
         if (text == errorText(code)) return code;
     return ErrorTypeNoError;
@@ -207,28 +195,6 @@ std::wstring inlineText(const Cell& cell) {
 }  // namespace
 
 template <class TCHAR, class Tag>
-void XMLSheetImplT<TCHAR, Tag>::numberRowsAndCells() {
-    auto* data = this->document().find_sheetData();
-    if (!data) return;
-    std::uint32_t previousRow = 0;
-    for (std::size_t i = 0; i < data->size_row(); ++i) {
-        Row& row = data->get_row(i);
-        if (!row.isset_r()) row.set_r(previousRow + 1);
-        previousRow = row.get_r();
-        int previousCol = -1;
-        for (std::size_t j = 0; j < row.size_c(); ++j) {
-            Cell& cell = row.get_c(j);
-            int col = cell.isset_r() ? cellColumn(cell.get_r()) : -1;
-            if (col < 0) {
-                col = previousCol + 1;
-                cell.set_r(cellRef(static_cast<int>(previousRow) - 1, col));
-            }
-            previousCol = col;
-        }
-    }
-}
-
-template <class TCHAR, class Tag>
 void XMLSheetImplT<TCHAR, Tag>::readColumnStyles() {
     colStyles_.assign(kMaxCol + 2, -1);
     auto& sheet = this->document();
@@ -246,7 +212,8 @@ void XMLSheetImplT<TCHAR, Tag>::readColumnStyles() {
 
 template <class TCHAR, class Tag>
 auto XMLSheetImplT<TCHAR, Tag>::findRow(int row) const -> Row* {
-    const auto* data = this->document().find_sheetData();
+    // Lookups hand out cells the caller may change; the search itself changes nothing.
+    auto* data = const_cast<Worksheet&>(this->document()).find_sheetData();
     if (!data || data->size_row() == 0) return nullptr;
     const auto wanted = static_cast<std::uint32_t>(row + 1);
     std::size_t low = 0, high = data->size_row();
@@ -286,19 +253,19 @@ auto XMLSheetImplT<TCHAR, Tag>::rowAt(int row) -> Row& {
 
 template <class TCHAR, class Tag>
 auto XMLSheetImplT<TCHAR, Tag>::findCell(int row, int col) const -> Cell* {
-    const Row* found = findRow(row);
+    Row* found = findRow(row);
     if (!found || found->size_c() == 0) return nullptr;
     std::size_t low = 0, high = found->size_c();
     // A row without gaps holds column n at position n: one reference parsed instead of a search.
-    if (static_cast<std::size_t>(col) < high && cellColumn(found->get_c(static_cast<std::size_t>(col)).get_r()) == col)
+    if (static_cast<std::size_t>(col) < high && static_cast<int>(found->get_c(static_cast<std::size_t>(col)).col()) == col)
         return &found->get_c(static_cast<std::size_t>(col));
-    if (cellColumn(found->get_c(high - 1).get_r()) == col) return &found->get_c(high - 1);
+    if (static_cast<int>(found->get_c(high - 1).col()) == col) return &found->get_c(high - 1);
     while (low < high) {
         const std::size_t mid = low + (high - low) / 2;
-        if (cellColumn(found->get_c(mid).get_r()) < col) low = mid + 1;
+        if (static_cast<int>(found->get_c(mid).col()) < col) low = mid + 1;
         else high = mid;
     }
-    return low < found->size_c() && cellColumn(found->get_c(low).get_r()) == col ? &found->get_c(low) : nullptr;
+    return low < found->size_c() && static_cast<int>(found->get_c(low).col()) == col ? &found->get_c(low) : nullptr;
 }
 
 template <class TCHAR, class Tag>
@@ -310,7 +277,7 @@ auto XMLSheetImplT<TCHAR, Tag>::cellAt(int row, int col, IFormatT<TCHAR>* format
     Cell* cell = nullptr;
     bool created = false;
     const std::size_t count = target.size_c();
-    const int lastCol = count ? cellColumn(target.get_c(count - 1).get_r()) : -1;
+    const int lastCol = count ? static_cast<int>(target.get_c(count - 1).col()) : -1;
     if (count == 0 || lastCol < col) {
         cell = &target.append_c();
         created = true;
@@ -320,17 +287,17 @@ auto XMLSheetImplT<TCHAR, Tag>::cellAt(int row, int col, IFormatT<TCHAR>* format
         std::size_t low = 0, high = count;
         while (low < high) {
             const std::size_t mid = low + (high - low) / 2;
-            if (cellColumn(target.get_c(mid).get_r()) < col) low = mid + 1;
+            if (static_cast<int>(target.get_c(mid).col()) < col) low = mid + 1;
             else high = mid;
         }
-        if (cellColumn(target.get_c(low).get_r()) == col) {
+        if (static_cast<int>(target.get_c(low).col()) == col) {
             cell = &target.get_c(low);
         } else {
             cell = &target.insert_c(low);
             created = true;
         }
     }
-    if (created) cell->set_r(cellRef(row, col));
+    if (created) cell->set_ref(static_cast<std::uint32_t>(row), static_cast<std::uint32_t>(col));
     if (style >= 0) {
         cell->set_s(static_cast<std::uint32_t>(style));
     } else if (created) {
@@ -449,11 +416,11 @@ const TCHAR* XMLSheetImplT<TCHAR, Tag>::readStr(int row, int col, IFormatT<TCHAR
                 stringResult_ = decodeXstring(strings->get(static_cast<int>(index)));
             }
         } else if (type == kTypeStr && cell.isset_v()) {
-            stringResult_ = decodeXstring(cell.get_v());
+            stringResult_ = decodeXstring(fromUtf8(std::string(cell.get_v())));
         } else if (type == kTypeInline) {
             stringResult_ = decodeXstring(inlineText(cell));
         } else if (type == kTypeNumber && cell.isset_v()) {
-            stringResult_ = cell.get_v();
+            stringResult_ = fromUtf8(std::string(cell.get_v()));
         } else {
             throw qrerror("this cell doesn't contain a string");
         }
@@ -481,8 +448,8 @@ bool XMLSheetImplT<TCHAR, Tag>::readBool(int row, int col, IFormatT<TCHAR>** for
         const Cell& cell = existingCell(row, col);
         if (cell.get_t() != kTypeBool || !cell.isset_v()) throw qrerror("this cell doesn't contain a bool");
         returnFormat(cell, format);
-        const std::wstring& v = cell.get_v();
-        return v == L"1" || v == L"true";
+        const std::string_view v = cell.get_v();
+        return v == "1" || v == "true";
     });
 }
 
@@ -526,7 +493,8 @@ template <class TCHAR, class Tag>
 bool XMLSheetImplT<TCHAR, Tag>::writeNum(int row, int col, double value, IFormatT<TCHAR>* format) {
     return message().guard(false, [&]() -> bool {
         Cell& cell = cellAt(row, col, format, true);
-        cell.set_v(numberText(value));
+        char buffer[32];
+        cell.set_v(numberText(value, buffer));
         return true;
     });
 }
@@ -545,9 +513,9 @@ bool XMLSheetImplT<TCHAR, Tag>::writeStr(int row, int col, const TCHAR* value, I
             const int index = book_->sharedStrings().add(value);
             Cell& cell = cellAt(row, col, format, true);
             cell.set_t(kTypeShared);
-            cell.set_v(std::to_wstring(index));
+            cell.set_v(std::to_string(index));
         } else if (stringKind == 1) {
-            cellAt(row, col, format, true).set_v(value);
+            cellAt(row, col, format, true).set_v(toUtf8(std::wstring(value)));
         } else {
             cellAt(row, col, format, true);
         }
@@ -558,7 +526,7 @@ bool XMLSheetImplT<TCHAR, Tag>::writeStr(int row, int col, const TCHAR* value, I
 template <class TCHAR, class Tag>
 bool XMLSheetImplT<TCHAR, Tag>::writeBool(int row, int col, bool value, IFormatT<TCHAR>* format, int errorCode) {
     return message().guard(false, [&]() -> bool {
-        const wchar_t* error = errorCode == ErrorTypeNoError ? nullptr : errorText(errorCode);
+        const char* error = errorCode == ErrorTypeNoError ? nullptr : errorText(errorCode);
         if (errorCode != ErrorTypeNoError && !error) throw qrerror("unknown error value");
         Cell& cell = cellAt(row, col, format, true);
         if (error) {
@@ -566,7 +534,7 @@ bool XMLSheetImplT<TCHAR, Tag>::writeBool(int row, int col, bool value, IFormatT
             cell.set_v(error);
         } else {
             cell.set_t(kTypeBool);
-            cell.set_v(value ? L"1" : L"0");
+            cell.set_v(value ? "1" : "0");
         }
         return true;
     });
@@ -599,7 +567,8 @@ auto XMLSheetImplT<TCHAR, Tag>::sharedMaster(const Cell& cell, int& masterRow, i
             const Cell& candidate = row.get_c(j);
             const auto* cf = candidate.find_f();
             if (cf && cf->get_t() == kFormulaShared && cf->isset_si() && cf->get_si() == f->get_si() && cf->isset_ref()) {
-                if (!parseCellRef(candidate.get_r(), masterRow, masterCol)) return nullptr;
+                masterRow = static_cast<int>(candidate.row());
+                masterCol = static_cast<int>(candidate.col());
                 return &candidate;
             }
         }
@@ -646,14 +615,18 @@ bool XMLSheetImplT<TCHAR, Tag>::writeFormulaValue(int row, int col, const TCHAR*
         }
         f.set_value(formula.text);
         switch (kind) {
-        case 1: cell.set_v(numberText(number)); break;
+        case 1: {
+            char buffer[32];
+            cell.set_v(numberText(number, buffer));
+            break;
+        }
         case 2:
             cell.set_t(kTypeStr);
-            cell.set_v(encodeXstring(text));
+            cell.set_v(toUtf8(encodeXstring(text)));
             break;
         case 3:
             cell.set_t(kTypeBool);
-            cell.set_v(flag ? L"1" : L"0");
+            cell.set_v(flag ? "1" : "0");
             break;
         default: break;
         }
@@ -714,7 +687,7 @@ void XMLSheetImplT<TCHAR, Tag>::refreshUsedRange() {
             for (std::size_t j = 0; j < row.size_c(); ++j) {
                 const Cell& cell = row.get_c(j);
                 if (!hasContent(cell) && !cell.isset_s()) continue;
-                const int c = cellColumn(cell.get_r());
+                const int c = static_cast<int>(cell.col());
                 if (c < 0) continue;
                 if (!any) {
                     usedFirstRow_ = r;
@@ -1076,7 +1049,7 @@ void XMLSheetImplT<TCHAR, Tag>::clear(int rowFirst, int rowLast, int colFirst, i
                 const int r = static_cast<int>(row.get_r()) - 1;
                 if (r < rowFirst || r > rowLast) continue;
                 for (std::size_t j = row.size_c(); j-- > 0;) {
-                    const int c = cellColumn(row.get_c(j).get_r());
+                    const int c = static_cast<int>(row.get_c(j).col());
                     if (c >= colFirst && c <= colLast) row.delete_c(j);
                 }
             }
@@ -1115,7 +1088,7 @@ void XMLSheetImplT<TCHAR, Tag>::moveRows(int rowFirst, int count) {
         row.set_r(static_cast<std::uint32_t>(moved + 1));
         for (std::size_t j = 0; j < row.size_c(); ++j) {
             Cell& cell = row.get_c(j);
-            cell.set_r(cellRef(moved, cellColumn(cell.get_r())));
+            cell.move_to_row(static_cast<std::uint32_t>(moved));
         }
     }
     if (auto* merges = this->document().find_mergeCells()) {
@@ -1162,7 +1135,7 @@ void XMLSheetImplT<TCHAR, Tag>::moveCols(int colFirst, int count) {
         const int r = static_cast<int>(row.get_r()) - 1;
         for (std::size_t j = row.size_c(); j-- > 0;) {
             Cell& cell = row.get_c(j);
-            const int c = cellColumn(cell.get_r());
+            const int c = static_cast<int>(cell.col());
             if (count < 0 && c >= colFirst && c <= removedLast) {
                 row.delete_c(j);
                 continue;
@@ -1173,7 +1146,7 @@ void XMLSheetImplT<TCHAR, Tag>::moveCols(int colFirst, int count) {
                 row.delete_c(j);
                 continue;
             }
-            cell.set_r(cellRef(r, moved));
+            cell.set_ref(static_cast<std::uint32_t>(r), static_cast<std::uint32_t>(moved));
         }
     }
     if (auto* merges = this->document().find_mergeCells()) {

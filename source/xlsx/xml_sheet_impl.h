@@ -191,7 +191,6 @@ private:
     Cell& existingCell(int row, int col) const;
     void returnFormat(const Cell& cell, IFormatT<TCHAR>** format);
     // Gives every row and cell read without a reference its position as one.
-    void numberRowsAndCells();
     void readColumnStyles();
     void expandSharedFormula(Cell& master, int row, int col);
     const Cell* sharedMaster(const Cell& cell, int& masterRow, int& masterCol) const;

@@ -153,6 +153,14 @@ void c_xml_writer::text(std::wstring_view wide_text)
     flush_if_large();
 }
 
+std::string& c_xml_writer::markup_buffer()
+{
+    close_start_tag();
+    if (!open_elements_.empty())
+        open_elements_.back().has_children = true;
+    return out_;
+}
+
 void c_xml_writer::end_element()
 {
     if (open_elements_.empty())

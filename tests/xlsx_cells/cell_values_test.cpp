@@ -145,7 +145,7 @@ TEST(Formulas, SharedFormulasReadFromTheMaster) {
         auto& row = r < static_cast<int>(data.size_row()) ? data.get_row(static_cast<std::size_t>(r)) : data.append_row();
         row.set_r(static_cast<std::uint32_t>(r + 1));
         auto& cell = row.append_c();
-        cell.set_r(L"B" + std::to_wstring(r + 1));
+        cell.set_ref(static_cast<std::uint32_t>(r), 1);
         auto& f = cell.get_f();
         f.set_t(3);
         f.set_si(0);

@@ -74,6 +74,10 @@ GROUPS = [
           [(XDR, "wsDr", "CT_Drawing")], strict=True, main=XDR),
 ]
 
+# Classes written by hand (ooxml/binding/sheet_data.h): a sheet holds millions of rows and cells,
+# so they are kept compact and read and written by their own code.
+HAND_WRITTEN = {"c_CT_SheetData": "sheet_data_t", "c_CT_Row": "row_t", "c_CT_Cell": "cell_t"}
+
 CPP_TYPES = {
     "string": "std::wstring", "bool": "bool", "double": "double",
     "u8": "std::uint32_t", "u16": "std::uint32_t", "u32": "std::uint32_t", "u64": "std::uint64_t",
@@ -135,6 +139,10 @@ class Emitter:
                 self.token(s.ns, s.name)
         for ns, element, type_name in group.roots:
             self.token(self.r.ns(ns), element)
+
+    @staticmethod
+    def hand_written(info):
+        return info.name in HAND_WRITTEN
 
     def xstring_class(self):
         key = ("", "ST_Xstring_space")
@@ -297,8 +305,10 @@ class Emitter:
         ns = self.g.namespace
         out = [self.banner(), "#pragma once\n#include <cstddef>\n#include <cstdint>\n#include <string>\n"
                "#include <vector>\n\n#include \"lmx/lmx.h\"\n#include \"ooxml/binding/foreign_content.h\"\n"
-               "#include \"ooxml/binding/ordered_set.h\"\n#include \"ooxml/binding/owned.h\"\n\n"
-               "namespace %s {\n\n" % ns]
+               "#include \"ooxml/binding/ordered_set.h\"\n#include \"ooxml/binding/owned.h\"\n%s\n"
+               "namespace %s {\n\n" % (
+                   "#include \"ooxml/binding/sheet_data.h\"\n" if any(self.hand_written(c) for c in self.classes) else "",
+                   ns)]
         out.append("extern const lmx::c_namespace_entry k_namespaces[];\nextern const lmx::c_token_entry k_tokens[];\n")
         out.append("// The namespace declarations written on the document element of a part.\n"
                    "void declare_namespaces(lmx::c_xml_writer& writer);\n\n")
@@ -316,21 +326,25 @@ class Emitter:
             out.append("enum %s : int {\n%s\n};\n" % (ident, "\n".join(members)))
         out.append("\n")
         for info in self.classes:
-            out.append("class %s;\n" % info.name)
-        if any(c.row_limits for c in self.classes):
-            out.append("\n// Receives the rows of sheet data one at a time instead of keeping them; the row object\n"
-                       "// is reused for the next row.\nclass c_row_handler {\npublic:\n"
-                       "    virtual ~c_row_handler() = default;\n"
-                       "    virtual lmx::elmx_error row(c_CT_Row& row) = 0;\n};\n")
+            if not self.hand_written(info):
+                out.append("class %s;\n" % info.name)
+        if any(self.hand_written(c) for c in self.classes):
+            out.append("\n// The cells of a worksheet are the hand-written classes, over this group's types.\n"
+                       "struct c_sheet_cell_types {\n"
+                       "    using formula = c_CT_CellFormula;\n    using rich_text = c_CT_Rst;\n"
+                       "    using extension_list = c_CT_ExtensionList;\n"
+                       "    static const char* main_namespace() { return %s; }\n"
+                       "    static void declare(lmx::c_xml_writer& writer) { declare_namespaces(writer); }\n};\n"
+                       % cpp_string(self.g.main))
+            for name, template in sorted(HAND_WRITTEN.items()):
+                out.append("using %s = quire::ooxml::%s<c_sheet_cell_types>;\n" % (name, template))
+            out.append("// Receives the rows of sheet data one at a time instead of keeping them.\n"
+                       "using c_row_handler = quire::ooxml::row_handler_t<c_sheet_cell_types>;\n")
         out.append("\n")
         inline_defs = []
         for info in self.classes:
-            out.append(self.class_declaration(info, inline_defs))
-        if any(c.name == "c_CT_Cell" for c in self.classes):
-            out.append("// A cell object reused cell after cell while a worksheet streams.\n"
-                       "class c_CT_Cell_Worker : public c_CT_Cell {\npublic:\n"
-                       "    using c_f = c_CT_CellFormula;\n"
-                       "    void reuse() { reset(); }\n};\n\n")
+            if not self.hand_written(info):
+                out.append(self.class_declaration(info, inline_defs))
         out.extend(inline_defs)
         out.append("}  // namespace %s\n" % ns)
         return "".join(out)
@@ -443,6 +457,8 @@ class Emitter:
         if first:
             out.append(self.tables())
         for info in infos:
+            if self.hand_written(info):
+                continue
             out.append(self.unmarshal_code(info))
             out.append(self.marshal_code(info))
         out.append("}  // namespace %s\n" % ns)

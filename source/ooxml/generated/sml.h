@@ -10,6 +10,7 @@
 #include "ooxml/binding/foreign_content.h"
 #include "ooxml/binding/ordered_set.h"
 #include "ooxml/binding/owned.h"
+#include "ooxml/binding/sheet_data.h"
 
 namespace strict {
 
@@ -577,7 +578,6 @@ class c_CT_BorderPr;
 class c_CT_Borders;
 class c_CT_Break;
 class c_CT_CalcPr;
-class c_CT_Cell;
 class c_CT_CellAlignment;
 class c_CT_CellFormula;
 class c_CT_CellProtection;
@@ -694,7 +694,6 @@ class c_CT_ProtectedRanges;
 class c_CT_RElt;
 class c_CT_RPrElt;
 class c_CT_RgbColor;
-class c_CT_Row;
 class c_CT_Rst;
 class c_CT_Scenario;
 class c_CT_Scenarios;
@@ -702,7 +701,6 @@ class c_CT_Selection;
 class c_CT_Sheet;
 class c_CT_SheetBackgroundPicture;
 class c_CT_SheetCalcPr;
-class c_CT_SheetData;
 class c_CT_SheetDimension;
 class c_CT_SheetFormatPr;
 class c_CT_SheetPr;
@@ -744,13 +742,19 @@ class c_CT_Xf;
 class c_CT_XmlColumnPr;
 class c_ST_Xstring_space;
 
-// Receives the rows of sheet data one at a time instead of keeping them; the row object
-// is reused for the next row.
-class c_row_handler {
-public:
-    virtual ~c_row_handler() = default;
-    virtual lmx::elmx_error row(c_CT_Row& row) = 0;
+// The cells of a worksheet are the hand-written classes, over this group's types.
+struct c_sheet_cell_types {
+    using formula = c_CT_CellFormula;
+    using rich_text = c_CT_Rst;
+    using extension_list = c_CT_ExtensionList;
+    static const char* main_namespace() { return "http://purl.oclc.org/ooxml/spreadsheetml/main"; }
+    static void declare(lmx::c_xml_writer& writer) { declare_namespaces(writer); }
 };
+using c_CT_Cell = quire::ooxml::cell_t<c_sheet_cell_types>;
+using c_CT_Row = quire::ooxml::row_t<c_sheet_cell_types>;
+using c_CT_SheetData = quire::ooxml::sheet_data_t<c_sheet_cell_types>;
+// Receives the rows of sheet data one at a time instead of keeping them.
+using c_row_handler = quire::ooxml::row_handler_t<c_sheet_cell_types>;
 
 class c_CT_Authors {
 public:
@@ -1256,88 +1260,6 @@ private:
     bool m_has_concurrentManualCount = false;
     bool m_forceFullCalc{false};
     bool m_has_forceFullCalc = false;
-    quire::ooxml::c_owned<quire::ooxml::c_foreign> m_foreign_;
-};
-
-class c_CT_Cell {
-public:
-    lmx::elmx_error unmarshal(lmx::c_xml_reader& reader, const std::string& name);
-    lmx::elmx_error marshal(lmx::c_xml_writer& writer, const char* name) const;
-    // Back to the state of a new object.
-    void reset() { *this = c_CT_Cell(); }
-    // Content outside the schema, kept for writing back; null when there is none.
-    const quire::ooxml::c_foreign* foreign() const { return m_foreign_.get(); }
-    // optional attribute r
-    const std::wstring& get_r() const { return m_r; }
-    void set_r(const std::wstring& value) { m_r = value; m_has_r = true; }
-    bool isset_r() const { return m_has_r; }
-    void unset_r() { m_r = std::wstring{}; m_has_r = false; }
-    // optional attribute s (default 0)
-    const std::uint32_t& get_s() const { return m_s; }
-    void set_s(const std::uint32_t& value) { m_s = value; m_has_s = true; }
-    bool isset_s() const { return m_has_s; }
-    void unset_s() { m_s = std::uint32_t{0u}; m_has_s = false; }
-    // optional attribute t (default n)
-    const int& get_t() const { return m_t; }
-    void set_t(const int& value) { m_t = value; m_has_t = true; }
-    bool isset_t() const { return m_has_t; }
-    void unset_t() { m_t = int{1}; m_has_t = false; }
-    // optional attribute cm (default 0)
-    const std::uint32_t& get_cm() const { return m_cm; }
-    void set_cm(const std::uint32_t& value) { m_cm = value; m_has_cm = true; }
-    bool isset_cm() const { return m_has_cm; }
-    void unset_cm() { m_cm = std::uint32_t{0u}; m_has_cm = false; }
-    // optional attribute vm (default 0)
-    const std::uint32_t& get_vm() const { return m_vm; }
-    void set_vm(const std::uint32_t& value) { m_vm = value; m_has_vm = true; }
-    bool isset_vm() const { return m_has_vm; }
-    void unset_vm() { m_vm = std::uint32_t{0u}; m_has_vm = false; }
-    // optional attribute ph (default false)
-    const bool& get_ph() const { return m_ph; }
-    void set_ph(const bool& value) { m_ph = value; m_has_ph = true; }
-    bool isset_ph() const { return m_has_ph; }
-    void unset_ph() { m_ph = bool{false}; m_has_ph = false; }
-    // optional element f
-    // Created when absent.
-    c_CT_CellFormula& get_f() { return m_f.create(); }
-    c_CT_CellFormula* find_f() const { return m_f.get(); }
-    bool isset_f() const { return static_cast<bool>(m_f); }
-    void unset_f() { m_f.reset(); }
-    // optional element v
-    const std::wstring& get_v() const { return m_v; }
-    void set_v(const std::wstring& value) { m_v = value; m_has_v = true; }
-    bool isset_v() const { return m_has_v; }
-    void unset_v() { m_v = std::wstring{}; m_has_v = false; }
-    // optional element is
-    // Created when absent.
-    c_CT_Rst& get_is() { return m_is.create(); }
-    c_CT_Rst* find_is() const { return m_is.get(); }
-    bool isset_is() const { return static_cast<bool>(m_is); }
-    void unset_is() { m_is.reset(); }
-    // optional element extLst
-    // Created when absent.
-    c_CT_ExtensionList& get_extLst() { return m_extLst.create(); }
-    c_CT_ExtensionList* find_extLst() const { return m_extLst.get(); }
-    bool isset_extLst() const { return static_cast<bool>(m_extLst); }
-    void unset_extLst() { m_extLst.reset(); }
-private:
-    std::wstring m_r{};
-    bool m_has_r = false;
-    std::uint32_t m_s{0u};
-    bool m_has_s = false;
-    int m_t{1};
-    bool m_has_t = false;
-    std::uint32_t m_cm{0u};
-    bool m_has_cm = false;
-    std::uint32_t m_vm{0u};
-    bool m_has_vm = false;
-    bool m_ph{false};
-    bool m_has_ph = false;
-    quire::ooxml::c_owned<c_CT_CellFormula> m_f;
-    std::wstring m_v{};
-    bool m_has_v = false;
-    quire::ooxml::c_owned<c_CT_Rst> m_is;
-    quire::ooxml::c_owned<c_CT_ExtensionList> m_extLst;
     quire::ooxml::c_owned<quire::ooxml::c_foreign> m_foreign_;
 };
 
@@ -6927,117 +6849,6 @@ private:
     quire::ooxml::c_owned<quire::ooxml::c_foreign> m_foreign_;
 };
 
-class c_CT_Row {
-public:
-    lmx::elmx_error unmarshal(lmx::c_xml_reader& reader, const std::string& name);
-    lmx::elmx_error marshal(lmx::c_xml_writer& writer, const char* name) const;
-    // Back to the state of a new object.
-    void reset() { *this = c_CT_Row(); }
-    // Content outside the schema, kept for writing back; null when there is none.
-    const quire::ooxml::c_foreign* foreign() const { return m_foreign_.get(); }
-    // optional attribute r
-    const std::uint32_t& get_r() const { return m_r; }
-    void set_r(const std::uint32_t& value) { m_r = value; m_has_r = true; }
-    bool isset_r() const { return m_has_r; }
-    void unset_r() { m_r = std::uint32_t{0}; m_has_r = false; }
-    // optional attribute spans
-    const std::wstring& get_spans() const { return m_spans; }
-    void set_spans(const std::wstring& value) { m_spans = value; m_has_spans = true; }
-    bool isset_spans() const { return m_has_spans; }
-    void unset_spans() { m_spans = std::wstring{}; m_has_spans = false; }
-    // optional attribute s (default 0)
-    const std::uint32_t& get_s() const { return m_s; }
-    void set_s(const std::uint32_t& value) { m_s = value; m_has_s = true; }
-    bool isset_s() const { return m_has_s; }
-    void unset_s() { m_s = std::uint32_t{0u}; m_has_s = false; }
-    // optional attribute customFormat (default false)
-    const bool& get_customFormat() const { return m_customFormat; }
-    void set_customFormat(const bool& value) { m_customFormat = value; m_has_customFormat = true; }
-    bool isset_customFormat() const { return m_has_customFormat; }
-    void unset_customFormat() { m_customFormat = bool{false}; m_has_customFormat = false; }
-    // optional attribute ht
-    const double& get_ht() const { return m_ht; }
-    void set_ht(const double& value) { m_ht = value; m_has_ht = true; }
-    bool isset_ht() const { return m_has_ht; }
-    void unset_ht() { m_ht = double{0.0}; m_has_ht = false; }
-    // optional attribute hidden (default false)
-    const bool& get_hidden() const { return m_hidden; }
-    void set_hidden(const bool& value) { m_hidden = value; m_has_hidden = true; }
-    bool isset_hidden() const { return m_has_hidden; }
-    void unset_hidden() { m_hidden = bool{false}; m_has_hidden = false; }
-    // optional attribute customHeight (default false)
-    const bool& get_customHeight() const { return m_customHeight; }
-    void set_customHeight(const bool& value) { m_customHeight = value; m_has_customHeight = true; }
-    bool isset_customHeight() const { return m_has_customHeight; }
-    void unset_customHeight() { m_customHeight = bool{false}; m_has_customHeight = false; }
-    // optional attribute outlineLevel (default 0)
-    const std::uint32_t& get_outlineLevel() const { return m_outlineLevel; }
-    void set_outlineLevel(const std::uint32_t& value) { m_outlineLevel = value; m_has_outlineLevel = true; }
-    bool isset_outlineLevel() const { return m_has_outlineLevel; }
-    void unset_outlineLevel() { m_outlineLevel = std::uint32_t{0u}; m_has_outlineLevel = false; }
-    // optional attribute collapsed (default false)
-    const bool& get_collapsed() const { return m_collapsed; }
-    void set_collapsed(const bool& value) { m_collapsed = value; m_has_collapsed = true; }
-    bool isset_collapsed() const { return m_has_collapsed; }
-    void unset_collapsed() { m_collapsed = bool{false}; m_has_collapsed = false; }
-    // optional attribute thickTop (default false)
-    const bool& get_thickTop() const { return m_thickTop; }
-    void set_thickTop(const bool& value) { m_thickTop = value; m_has_thickTop = true; }
-    bool isset_thickTop() const { return m_has_thickTop; }
-    void unset_thickTop() { m_thickTop = bool{false}; m_has_thickTop = false; }
-    // optional attribute thickBot (default false)
-    const bool& get_thickBot() const { return m_thickBot; }
-    void set_thickBot(const bool& value) { m_thickBot = value; m_has_thickBot = true; }
-    bool isset_thickBot() const { return m_has_thickBot; }
-    void unset_thickBot() { m_thickBot = bool{false}; m_has_thickBot = false; }
-    // optional attribute ph (default false)
-    const bool& get_ph() const { return m_ph; }
-    void set_ph(const bool& value) { m_ph = value; m_has_ph = true; }
-    bool isset_ph() const { return m_has_ph; }
-    void unset_ph() { m_ph = bool{false}; m_has_ph = false; }
-    // optional element c, repeated
-    std::size_t size_c() const { return m_c.size(); }
-    c_CT_Cell& get_c(std::size_t index) const { return *m_c[index]; }
-    c_CT_Cell& append_c();
-    c_CT_Cell& insert_c(std::size_t index);
-    void delete_c(std::size_t index);
-    void clear_c();
-    // optional element extLst
-    // Created when absent.
-    c_CT_ExtensionList& get_extLst() { return m_extLst.create(); }
-    c_CT_ExtensionList* find_extLst() const { return m_extLst.get(); }
-    bool isset_extLst() const { return static_cast<bool>(m_extLst); }
-    void unset_extLst() { m_extLst.reset(); }
-private:
-    std::uint32_t m_r{0};
-    bool m_has_r = false;
-    std::wstring m_spans{};
-    bool m_has_spans = false;
-    std::uint32_t m_s{0u};
-    bool m_has_s = false;
-    bool m_customFormat{false};
-    bool m_has_customFormat = false;
-    double m_ht{0.0};
-    bool m_has_ht = false;
-    bool m_hidden{false};
-    bool m_has_hidden = false;
-    bool m_customHeight{false};
-    bool m_has_customHeight = false;
-    std::uint32_t m_outlineLevel{0u};
-    bool m_has_outlineLevel = false;
-    bool m_collapsed{false};
-    bool m_has_collapsed = false;
-    bool m_thickTop{false};
-    bool m_has_thickTop = false;
-    bool m_thickBot{false};
-    bool m_has_thickBot = false;
-    bool m_ph{false};
-    bool m_has_ph = false;
-    std::vector<quire::ooxml::c_owned<c_CT_Cell>> m_c;
-    quire::ooxml::c_owned<c_CT_ExtensionList> m_extLst;
-    quire::ooxml::c_owned<quire::ooxml::c_foreign> m_foreign_;
-};
-
 class c_CT_Rst {
 public:
     lmx::elmx_error unmarshal(lmx::c_xml_reader& reader, const std::string& name);
@@ -7298,30 +7109,6 @@ public:
 private:
     bool m_fullCalcOnLoad{false};
     bool m_has_fullCalcOnLoad = false;
-    quire::ooxml::c_owned<quire::ooxml::c_foreign> m_foreign_;
-};
-
-class c_CT_SheetData {
-public:
-    lmx::elmx_error unmarshal(lmx::c_xml_reader& reader, const std::string& name);
-    // Rows outside first_row..last_row (0-based, -1: no bound) are passed over; with a
-    // handler the rows go to it instead of into the sheet data.
-    lmx::elmx_error unmarshal(lmx::c_xml_reader& reader, const std::string& name, int first_row,
-                              int last_row, c_row_handler* handler = nullptr);
-    lmx::elmx_error marshal(lmx::c_xml_writer& writer, const char* name) const;
-    // Back to the state of a new object.
-    void reset() { *this = c_CT_SheetData(); }
-    // Content outside the schema, kept for writing back; null when there is none.
-    const quire::ooxml::c_foreign* foreign() const { return m_foreign_.get(); }
-    // optional element row, repeated
-    std::size_t size_row() const { return m_row.size(); }
-    c_CT_Row& get_row(std::size_t index) const { return *m_row[index]; }
-    c_CT_Row& append_row();
-    c_CT_Row& insert_row(std::size_t index);
-    void delete_row(std::size_t index);
-    void clear_row();
-private:
-    std::vector<quire::ooxml::c_owned<c_CT_Row>> m_row;
     quire::ooxml::c_owned<quire::ooxml::c_foreign> m_foreign_;
 };
 
@@ -10051,13 +9838,6 @@ private:
     quire::ooxml::c_owned<quire::ooxml::c_foreign> m_foreign_;
 };
 
-// A cell object reused cell after cell while a worksheet streams.
-class c_CT_Cell_Worker : public c_CT_Cell {
-public:
-    using c_f = c_CT_CellFormula;
-    void reuse() { reset(); }
-};
-
 inline c_CT_FilterColumn& c_CT_AutoFilter::append_filterColumn() {
     m_filterColumn.emplace_back();
     return m_filterColumn.back().create();
@@ -11153,19 +10933,6 @@ inline void c_CT_RPrElt::clear_scheme() {
     quire::ooxml::order_clear(m_order_0, 14);
     m_scheme.clear();
 }
-inline c_CT_Cell& c_CT_Row::append_c() {
-    m_c.emplace_back();
-    return m_c.back().create();
-}
-inline c_CT_Cell& c_CT_Row::insert_c(std::size_t index) {
-    return m_c.emplace(m_c.begin() + static_cast<std::ptrdiff_t>(index))->create();
-}
-inline void c_CT_Row::delete_c(std::size_t index) {
-    m_c.erase(m_c.begin() + static_cast<std::ptrdiff_t>(index));
-}
-inline void c_CT_Row::clear_c() {
-    m_c.clear();
-}
 inline c_CT_RElt& c_CT_Rst::append_r() {
     m_r.emplace_back();
     return m_r.back().create();
@@ -11217,19 +10984,6 @@ inline void c_CT_Scenarios::delete_scenario(std::size_t index) {
 }
 inline void c_CT_Scenarios::clear_scenario() {
     m_scenario.clear();
-}
-inline c_CT_Row& c_CT_SheetData::append_row() {
-    m_row.emplace_back();
-    return m_row.back().create();
-}
-inline c_CT_Row& c_CT_SheetData::insert_row(std::size_t index) {
-    return m_row.emplace(m_row.begin() + static_cast<std::ptrdiff_t>(index))->create();
-}
-inline void c_CT_SheetData::delete_row(std::size_t index) {
-    m_row.erase(m_row.begin() + static_cast<std::ptrdiff_t>(index));
-}
-inline void c_CT_SheetData::clear_row() {
-    m_row.clear();
 }
 inline c_CT_Selection& c_CT_SheetView::append_selection() {
     m_selection.emplace_back();

@@ -46,6 +46,10 @@ public:
     void text(std::string_view utf8_text);
     void text(std::wstring_view text);
     void end_element();
+    // For callers that write well-formed markup of their own inside the current element:
+    // closes an open start tag and returns the output to append to; markup_done() afterwards.
+    std::string& markup_buffer();
+    void markup_done() { flush_if_large(); }
     // Hands buffered text to the stream (a no-op when writing to a string).
     void flush();
 
