@@ -17,10 +17,7 @@ int SharedStrings<Tag>::add(const std::wstring& text) {
     if (lastIndex_ >= 0 && !lastText_.empty() && stored == lastText_ &&
         lastIndex_ < static_cast<int>(table.size_si()))
         return lastIndex_;
-    auto& entry = table.append_si();
-    auto& t = entry.get_t();
-    if (!stored.empty() && (stored.front() == L' ' || stored.back() == L' ')) t.set_space(L"preserve");
-    t.set_value(stored);
+    table.append_plain_si(ooxml::write_utf8(stored));
     table.set_uniqueCount(static_cast<std::uint32_t>(table.size_si()));
     lastIndex_ = static_cast<int>(table.size_si()) - 1;
     lastText_ = std::move(stored);
@@ -32,11 +29,15 @@ std::wstring SharedStrings<Tag>::get(int index) const {
     const auto& table = this->document();
     if (index < 0 || static_cast<std::size_t>(index) >= table.size_si())
         throw qrerror("index is out of range or no value");
-    const auto& entry = table.get_si(static_cast<std::size_t>(index));
-    if (const auto* t = entry.find_t()) return t->get_value();
+    const auto* entry = table.rich_si(static_cast<std::size_t>(index));
     std::wstring text;
-    for (std::size_t i = 0; i < entry.size_r(); ++i)
-        if (const auto* t = entry.get_r(i).find_t()) text += t->get_value();
+    if (!entry) {
+        ooxml::read_value(table.plain_si(static_cast<std::size_t>(index)), text);
+        return text;
+    }
+    if (const auto* t = entry->find_t()) return t->get_value();
+    for (std::size_t i = 0; i < entry->size_r(); ++i)
+        if (const auto* t = entry->get_r(i).find_t()) text += t->get_value();
     return text;
 }
 

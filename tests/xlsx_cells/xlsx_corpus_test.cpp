@@ -42,18 +42,6 @@ const std::set<std::string>& openpyxlDiffers() {
     return files;
 }
 
-// Packages with cached results we do not read yet: a `v` element that carries an attribute
-// (xml:space="preserve" on text with leading or trailing spaces) is kept as unknown content.
-const std::set<std::string>& valuesWithAttributes() {
-    static const std::set<std::string> files = {
-        "poi/57181.xlsm",
-        "poi/FormulaEvalTestData_Copy.xlsx",
-        "poi/NumberFormatTests.xlsx",
-        "poi/StructuredRefs-lots-with-lookups.xlsx",
-    };
-    return files;
-}
-
 // openpyxl leaves _xHHHH_ escapes in the text; we decode them, and a text ends at a decoded NUL.
 std::string decodeEscapes(const std::string& text) {
     std::string out;
@@ -88,8 +76,7 @@ std::string decodeEscapes(const std::string& text) {
 //   empty string;
 // - openpyxl turns date-formatted numbers into times of a millisecond's precision and back;
 // - openpyxl does not decode _xHHHH_ escapes.
-// - in the packages of valuesWithAttributes, a cached text with spaces at an end reads empty.
-void reconcile(IBook& book, CellDump& expected, CellDump& ours, bool spacedTextsReadEmpty) {
+void reconcile(IBook& book, CellDump& expected, CellDump& ours) {
     std::vector<ISheet*> worksheets;
     for (int i = 0; i < book.sheetCount(); ++i)
         if (book.sheetType(i) == SheetTypeSheet && book.getSheet(i)) worksheets.push_back(book.getSheet(i));
@@ -118,10 +105,6 @@ void reconcile(IBook& book, CellDump& expected, CellDump& ours, bool spacedTexts
                 if (std::fabs(a - b) <= 1.0 / 86400000) want->second.value = it->second.value;
             } else if (want->second.kind == 'S') {
                 want->second.value = decodeEscapes(want->second.value);
-                const std::string& text = want->second.value;
-                if (spacedTextsReadEmpty && it->second.kind == 'S' && it->second.value.empty() && !text.empty() &&
-                    (text.front() == ' ' || text.back() == ' '))
-                    it->second.value = text;
             }
         }
         ++it;
@@ -155,7 +138,7 @@ TEST_P(XlsxCorpus, LoadsWithTheCellsOpenpyxlReads) {
     if (openpyxlDiffers().count(file.name)) return;
     CellDump expected = parseCellDump(expectedText);
     CellDump ours = dumpBook(*book);
-    reconcile(*book, expected, ours, valuesWithAttributes().count(file.name) > 0);
+    reconcile(*book, expected, ours);
     auto differences = compareDumps(expected, ours);
     for (const auto& d : differences) ADD_FAILURE() << d;
 }

@@ -74,9 +74,11 @@ GROUPS = [
           [(XDR, "wsDr", "CT_Drawing")], strict=True, main=XDR),
 ]
 
-# Classes written by hand (ooxml/binding/sheet_data.h): a sheet holds millions of rows and cells,
-# so they are kept compact and read and written by their own code.
-HAND_WRITTEN = {"c_CT_SheetData": "sheet_data_t", "c_CT_Row": "row_t", "c_CT_Cell": "cell_t"}
+# Classes written by hand (ooxml/binding/sheet_data.h, string_table.h): a sheet holds millions of
+# rows and cells and a book as many shared strings, so they are kept compact and read and written
+# by their own code.
+HAND_WRITTEN = {"c_CT_SheetData": "sheet_data_t", "c_CT_Row": "row_t", "c_CT_Cell": "cell_t",
+                "c_CT_Sst": "string_table_t"}
 
 CPP_TYPES = {
     "string": "std::wstring", "bool": "bool", "double": "double",
@@ -143,6 +145,14 @@ class Emitter:
     @staticmethod
     def hand_written(info):
         return info.name in HAND_WRITTEN
+
+    def hand_written_include(self):
+        names = {c.name for c in self.classes}
+        if "c_CT_Sst" in names:
+            return "#include \"ooxml/binding/string_table.h\"\n"
+        if "c_CT_Cell" in names:
+            return "#include \"ooxml/binding/sheet_data.h\"\n"
+        return ""
 
     def xstring_class(self):
         key = ("", "ST_Xstring_space")
@@ -307,7 +317,7 @@ class Emitter:
                "#include <vector>\n\n#include \"lmx/lmx.h\"\n#include \"ooxml/binding/foreign_content.h\"\n"
                "#include \"ooxml/binding/ordered_set.h\"\n#include \"ooxml/binding/owned.h\"\n%s\n"
                "namespace %s {\n\n" % (
-                   "#include \"ooxml/binding/sheet_data.h\"\n" if any(self.hand_written(c) for c in self.classes) else "",
+                   self.hand_written_include(),
                    ns)]
         out.append("extern const lmx::c_namespace_entry k_namespaces[];\nextern const lmx::c_token_entry k_tokens[];\n")
         out.append("// The namespace declarations written on the document element of a part.\n"
@@ -329,17 +339,21 @@ class Emitter:
             if not self.hand_written(info):
                 out.append("class %s;\n" % info.name)
         if any(self.hand_written(c) for c in self.classes):
-            out.append("\n// The cells of a worksheet are the hand-written classes, over this group's types.\n"
-                       "struct c_sheet_cell_types {\n"
-                       "    using formula = c_CT_CellFormula;\n    using rich_text = c_CT_Rst;\n"
+            names = {c.name for c in self.classes}
+            out.append("\n// The hand-written classes of this group, over its element types.\n"
+                       "struct c_part_types {\n%s"
+                       "    using rich_text = c_CT_Rst;\n"
                        "    using extension_list = c_CT_ExtensionList;\n"
                        "    static const char* main_namespace() { return %s; }\n"
                        "    static void declare(lmx::c_xml_writer& writer) { declare_namespaces(writer); }\n};\n"
-                       % cpp_string(self.g.main))
+                       % ("    using formula = c_CT_CellFormula;\n" if "c_CT_CellFormula" in names else "",
+                          cpp_string(self.g.main)))
             for name, template in sorted(HAND_WRITTEN.items()):
-                out.append("using %s = quire::ooxml::%s<c_sheet_cell_types>;\n" % (name, template))
-            out.append("// Receives the rows of sheet data one at a time instead of keeping them.\n"
-                       "using c_row_handler = quire::ooxml::row_handler_t<c_sheet_cell_types>;\n")
+                if name in names:
+                    out.append("using %s = quire::ooxml::%s<c_part_types>;\n" % (name, template))
+            if "c_CT_Cell" in names:
+                out.append("// Receives the rows of sheet data one at a time instead of keeping them.\n"
+                           "using c_row_handler = quire::ooxml::row_handler_t<c_part_types>;\n")
         out.append("\n")
         inline_defs = []
         for info in self.classes:

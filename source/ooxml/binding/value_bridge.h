@@ -31,6 +31,8 @@ lmx::elmx_error read_integer_as(std::string_view text, Field& value) {
 // An enumeration value as its index in `names` (count entries).
 lmx::elmx_error read_enum(std::string_view text, const char* const* names, int count, int& value);
 
+// Wide text as UTF-8 (characters outside Unicode become U+FFFD).
+std::string write_utf8(std::wstring_view text);
 // Shortest text that reads back as the same double.
 std::string write_double(double value);
 inline std::string_view write_bool(bool value) { return value ? "1" : "0"; }

@@ -10,6 +10,7 @@
 #include "ooxml/binding/foreign_content.h"
 #include "ooxml/binding/ordered_set.h"
 #include "ooxml/binding/owned.h"
+#include "ooxml/binding/string_table.h"
 
 namespace sharedStringTable {
 
@@ -66,10 +67,18 @@ class c_CT_PhoneticRun;
 class c_CT_RElt;
 class c_CT_RPrElt;
 class c_CT_Rst;
-class c_CT_Sst;
 class c_CT_UnderlineProperty;
 class c_CT_VerticalAlignFontProperty;
 class c_ST_Xstring_space;
+
+// The hand-written classes of this group, over its element types.
+struct c_part_types {
+    using rich_text = c_CT_Rst;
+    using extension_list = c_CT_ExtensionList;
+    static const char* main_namespace() { return "http://schemas.openxmlformats.org/spreadsheetml/2006/main"; }
+    static void declare(lmx::c_xml_writer& writer) { declare_namespaces(writer); }
+};
+using c_CT_Sst = quire::ooxml::string_table_t<c_part_types>;
 
 class c_CT_BooleanProperty {
 public:
@@ -519,47 +528,6 @@ private:
     quire::ooxml::c_owned<quire::ooxml::c_foreign> m_foreign_;
 };
 
-class c_CT_Sst {
-public:
-    lmx::elmx_error unmarshal(lmx::c_xml_reader& reader, const std::string& name);
-    lmx::elmx_error marshal(lmx::c_xml_writer& writer, const char* name) const;
-    // Back to the state of a new object.
-    void reset() { *this = c_CT_Sst(); }
-    // Content outside the schema, kept for writing back; null when there is none.
-    const quire::ooxml::c_foreign* foreign() const { return m_foreign_.get(); }
-    // optional attribute count
-    const std::uint32_t& get_count() const { return m_count; }
-    void set_count(const std::uint32_t& value) { m_count = value; m_has_count = true; }
-    bool isset_count() const { return m_has_count; }
-    void unset_count() { m_count = std::uint32_t{0}; m_has_count = false; }
-    // optional attribute uniqueCount
-    const std::uint32_t& get_uniqueCount() const { return m_uniqueCount; }
-    void set_uniqueCount(const std::uint32_t& value) { m_uniqueCount = value; m_has_uniqueCount = true; }
-    bool isset_uniqueCount() const { return m_has_uniqueCount; }
-    void unset_uniqueCount() { m_uniqueCount = std::uint32_t{0}; m_has_uniqueCount = false; }
-    // optional element si, repeated
-    std::size_t size_si() const { return m_si.size(); }
-    c_CT_Rst& get_si(std::size_t index) const { return *m_si[index]; }
-    c_CT_Rst& append_si();
-    c_CT_Rst& insert_si(std::size_t index);
-    void delete_si(std::size_t index);
-    void clear_si();
-    // optional element extLst
-    // Created when absent.
-    c_CT_ExtensionList& get_extLst() { return m_extLst.create(); }
-    c_CT_ExtensionList* find_extLst() const { return m_extLst.get(); }
-    bool isset_extLst() const { return static_cast<bool>(m_extLst); }
-    void unset_extLst() { m_extLst.reset(); }
-private:
-    std::uint32_t m_count{0};
-    bool m_has_count = false;
-    std::uint32_t m_uniqueCount{0};
-    bool m_has_uniqueCount = false;
-    std::vector<quire::ooxml::c_owned<c_CT_Rst>> m_si;
-    quire::ooxml::c_owned<c_CT_ExtensionList> m_extLst;
-    quire::ooxml::c_owned<quire::ooxml::c_foreign> m_foreign_;
-};
-
 class c_CT_UnderlineProperty {
 public:
     lmx::elmx_error unmarshal(lmx::c_xml_reader& reader, const std::string& name);
@@ -913,18 +881,5 @@ inline void c_CT_Rst::delete_rPh(std::size_t index) {
 }
 inline void c_CT_Rst::clear_rPh() {
     m_rPh.clear();
-}
-inline c_CT_Rst& c_CT_Sst::append_si() {
-    m_si.emplace_back();
-    return m_si.back().create();
-}
-inline c_CT_Rst& c_CT_Sst::insert_si(std::size_t index) {
-    return m_si.emplace(m_si.begin() + static_cast<std::ptrdiff_t>(index))->create();
-}
-inline void c_CT_Sst::delete_si(std::size_t index) {
-    m_si.erase(m_si.begin() + static_cast<std::ptrdiff_t>(index));
-}
-inline void c_CT_Sst::clear_si() {
-    m_si.clear();
 }
 }  // namespace sharedStringTable

@@ -483,19 +483,19 @@ class c_CT_WebPublishItems;
 class c_CT_Worksheet;
 class c_ST_Xstring_space;
 
-// The cells of a worksheet are the hand-written classes, over this group's types.
-struct c_sheet_cell_types {
+// The hand-written classes of this group, over its element types.
+struct c_part_types {
     using formula = c_CT_CellFormula;
     using rich_text = c_CT_Rst;
     using extension_list = c_CT_ExtensionList;
     static const char* main_namespace() { return "http://schemas.openxmlformats.org/spreadsheetml/2006/main"; }
     static void declare(lmx::c_xml_writer& writer) { declare_namespaces(writer); }
 };
-using c_CT_Cell = quire::ooxml::cell_t<c_sheet_cell_types>;
-using c_CT_Row = quire::ooxml::row_t<c_sheet_cell_types>;
-using c_CT_SheetData = quire::ooxml::sheet_data_t<c_sheet_cell_types>;
+using c_CT_Cell = quire::ooxml::cell_t<c_part_types>;
+using c_CT_Row = quire::ooxml::row_t<c_part_types>;
+using c_CT_SheetData = quire::ooxml::sheet_data_t<c_part_types>;
 // Receives the rows of sheet data one at a time instead of keeping them.
-using c_row_handler = quire::ooxml::row_handler_t<c_sheet_cell_types>;
+using c_row_handler = quire::ooxml::row_handler_t<c_part_types>;
 
 class c_CT_AutoFilter {
 public:
