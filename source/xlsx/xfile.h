@@ -1,6 +1,9 @@
 #pragma once
 // The part objects of an Open XML package.
+#include <functional>
 #include <memory>
+#include <ostream>
+#include <streambuf>
 #include <string>
 
 #include "api/qrerror.h"
@@ -38,9 +41,39 @@ std::string xmlErrorText(const std::string& partName, const lmx::c_xml_reader& r
 // Writes a document through `marshal` into a file or a buffer; a writer error becomes a qrerror.
 void writeXmlText(const std::string& fileName, std::string& buffer, const std::string& text);
 
+// Receives a part's bytes piece by piece.
+using ByteSink = std::function<void(const char* data, std::size_t size)>;
+
+// Hands what an output stream receives to a sink, unbuffered (the XML writer buffers already).
+class SinkStreambuf : public std::streambuf {
+public:
+    explicit SinkStreambuf(const ByteSink& sink) : sink_(sink) {}
+
+protected:
+    std::streamsize xsputn(const char* data, std::streamsize size) override {
+        sink_(data, static_cast<std::size_t>(size));
+        return size;
+    }
+    int_type overflow(int_type ch) override {
+        if (traits_type::eq_int_type(ch, traits_type::eof())) return traits_type::not_eof(ch);
+        const char byte = traits_type::to_char_type(ch);
+        sink_(&byte, 1);
+        return ch;
+    }
+
+private:
+    const ByteSink& sink_;
+};
+
+// A part written as XML text, which can go out in pieces instead of as one text.
+class XmlPart : public XFile {
+public:
+    virtual void writeTo(const ByteSink& sink) = 0;
+};
+
 // An XML part whose document element is bound to the generated class T.
 template <class T>
-class XmlFile : public XFile {
+class XmlFile : public XmlPart {
 public:
     explicit XmlFile(const char* rootName) : rootName_(rootName) {}
 
@@ -65,7 +98,19 @@ public:
             if (result != lmx::ELMX_OK) throw qrerror(std::string(lmx::error_message(result)));
         }
         text += "\n";
-        writeXmlText(fileName, buffer, text);
+        if (fileName.empty()) buffer.swap(text);
+        else writeXmlText(fileName, buffer, text);
+    }
+
+    void writeTo(const ByteSink& sink) override {
+        SinkStreambuf target(sink);
+        std::ostream stream(&target);
+        {
+            lmx::c_xml_writer writer(stream, lmx::c_xml_writer::flag_declaration | lmx::c_xml_writer::flag_standalone);
+            const lmx::elmx_error result = document_.marshal(writer, rootName_);
+            if (result != lmx::ELMX_OK) throw qrerror(std::string(lmx::error_message(result)));
+        }
+        sink("\n", 1);
     }
 
 protected:

@@ -809,6 +809,11 @@ void XMLBookImplT<TCHAR, Tag>::saveTo(const std::string& path, bool inMemory, bo
             TempFileGuard temp{tempPath};
             entry.second->write(tempPath, buffer);
             writer.addFile(entryName, tempPath);
+        } else if (auto* xml = dynamic_cast<XmlPart*>(entry.second)) {
+            // Deflated as the text is made: a sheet's text is never held whole.
+            writer.openEntry(entryName);
+            xml->writeTo([&writer](const char* data, std::size_t size) { writer.writeEntry(data, size); });
+            writer.closeEntry();
         } else {
             buffer.clear();
             entry.second->write(std::string(), buffer);

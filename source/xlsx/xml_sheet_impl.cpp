@@ -233,8 +233,11 @@ auto XMLSheetImplT<TCHAR, Tag>::rowAt(int row) -> Row& {
     const auto wanted = static_cast<std::uint32_t>(row + 1);
     const std::size_t count = data.size_row();
     if (count == 0 || data.get_row(count - 1).get_r() < wanted) {
+        // Rows written one after another tend to be as wide as the one before.
+        const std::size_t width = count ? data.get_row(count - 1).size_c() : 0;
         Row& created = data.append_row();
         created.set_r(wanted);
+        created.cells().reserve(width);
         return created;
     }
     // Writers fill a row cell by cell: its row is the last one.

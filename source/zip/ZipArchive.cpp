@@ -93,6 +93,7 @@ void CZipArchive::close()
 {
     if (!m_storage)
         return;
+    abandonNewFile();
     try {
         if (m_mode == create) {
             m_storage->seekToEnd();
@@ -112,6 +113,7 @@ void CZipArchive::close()
 
 void CZipArchive::abandon() noexcept
 {
+    m_openEntry.reset();
     if (m_ownedStorage) {
         try {
             m_ownedStorage->close();
@@ -255,10 +257,104 @@ void CZipArchive::addNewFile(const std::string& sourcePath, const std::wstring& 
     addNewFile(source, nameInZip, level, options, bufferSize);
 }
 
-void CZipArchive::addNewFile(CZipAbstractFile& source, const std::wstring& nameInZip, int level, int options,
-                             std::size_t bufferSize)
+// Compresses an entry's data as it arrives, counting CRC and sizes, and completes the local
+// header once the data has ended.
+class CZipArchive::EntryWriter {
+public:
+    EntryWriter(CZipAbstractFile& storage, CZipFileHeader header, int level, std::size_t bufferSize)
+        : m_storage(storage), m_header(std::move(header)), m_codec(CZipCompressor::forMethod(m_header.method)),
+          m_output(m_codec ? bufferSize : 0)
+    {
+        m_start = m_storage.position();
+        m_header.localHeaderOffset = m_start;
+        m_reserveZip64 = m_header.uncompressedSize >= CZipFileHeader::max32 - zip64Margin;
+        const std::string local = m_header.localRecord(m_reserveZip64);
+        m_storage.write(local.data(), local.size());
+        if (m_codec)
+            m_codec->beginCompression(level);
+    }
+
+    std::uint64_t start() const { return m_start; }
+
+    void write(const unsigned char* data, std::size_t size)
+    {
+        m_crc = updateCrc(m_crc, data, size);
+        m_read += size;
+        if (!m_codec) {
+            m_storage.write(data, size);
+            m_written += size;
+            return;
+        }
+        std::size_t consumed = 0;
+        while (consumed < size) {
+            const CZipCompressor::Progress step =
+                m_codec->compress(data + consumed, size - consumed, m_output.data(), m_output.size(), false);
+            consumed += step.consumed;
+            emit(step.produced);
+        }
+    }
+
+    CZipFileHeader finish(const std::string& sourceName)
+    {
+        if (m_codec) {
+            for (bool finished = false; !finished;) {
+                const CZipCompressor::Progress step =
+                    m_codec->compress(nullptr, 0, m_output.data(), m_output.size(), true);
+                emit(step.produced);
+                finished = step.finished;
+            }
+        }
+        m_header.crc32 = m_crc;
+        m_header.uncompressedSize = m_read;
+        m_header.compressedSize = m_written;
+        if (!m_reserveZip64 && (m_read >= CZipFileHeader::max32 || m_written >= CZipFileHeader::max32))
+            throw CZipException(CZipException::tooBigSize, sourceName);
+
+        const std::uint64_t end = m_storage.position();
+        ZipFieldWriter patch;
+        patch.u32(m_crc);
+        if (!m_reserveZip64) {
+            patch.u32(static_cast<std::uint32_t>(m_written));
+            patch.u32(static_cast<std::uint32_t>(m_read));
+        }
+        m_storage.seek(m_header.localHeaderOffset + CZipFileHeader::localCrcOffset);
+        m_storage.write(patch.data().data(), patch.size());
+        if (m_reserveZip64) {
+            ZipFieldWriter sizes;
+            sizes.u64(m_read);
+            sizes.u64(m_written);
+            m_storage.seek(m_header.localHeaderOffset + m_header.localZip64SizesOffset());
+            m_storage.write(sizes.data().data(), sizes.size());
+        }
+        m_storage.seek(end);
+        return m_header;
+    }
+
+private:
+    void emit(std::size_t produced)
+    {
+        m_storage.write(m_output.data(), produced);
+        m_written += produced;
+    }
+
+    CZipAbstractFile& m_storage;
+    CZipFileHeader m_header;
+    std::unique_ptr<CZipCompressor> m_codec;
+    std::vector<unsigned char> m_output;
+    std::uint64_t m_start = 0;
+    bool m_reserveZip64 = false;
+    std::uint32_t m_crc = 0;
+    std::uint64_t m_read = 0;
+    std::uint64_t m_written = 0;
+};
+
+CZipArchive::CZipArchive() = default;
+
+CZipFileHeader CZipArchive::newHeader(const std::wstring& nameInZip) const
 {
     requireMode(create);
+    if (m_openEntry)
+        throw CZipException(CZipException::internalError);
     if (nameInZip.empty())
         throw CZipException(EINVAL);
     CZipFileHeader header;
@@ -266,17 +362,37 @@ void CZipArchive::addNewFile(CZipAbstractFile& source, const std::wstring& nameI
     if (header.rawFileName().size() > 0xFFFF)
         throw CZipException(CZipException::tooLongData);
     header.setTime(std::time(nullptr));
+    header.method = CZipFileHeader::deflated;
+    header.versionNeeded = 20;
+    return header;
+}
+
+void CZipArchive::addNewFile(CZipAbstractFile& source, const std::wstring& nameInZip, int level, int options,
+                             std::size_t bufferSize)
+{
+    CZipFileHeader header = newHeader(nameInZip);
     const std::uint64_t sourceSize = source.length();
-    const bool storeIt = (options & storeSmallEntries) != 0 && sourceSize < smallEntrySize;
-    header.method = storeIt ? CZipFileHeader::stored : CZipFileHeader::deflated;
-    header.versionNeeded = storeIt ? 10 : 20;
+    if ((options & storeSmallEntries) != 0 && sourceSize < smallEntrySize) {
+        header.method = CZipFileHeader::stored;
+        header.versionNeeded = 10;
+    }
     header.uncompressedSize = sourceSize;
+    if (bufferSize == 0)
+        bufferSize = defaultTransferBufferSize;
 
     m_storage->seekToEnd();
     const std::uint64_t start = m_storage->position();
-    header.localHeaderOffset = start;
     try {
-        writeEntry(source, header, level, bufferSize == 0 ? defaultTransferBufferSize : bufferSize);
+        EntryWriter entry(*m_storage, std::move(header), level, bufferSize);
+        std::vector<unsigned char> input(bufferSize);
+        source.seek(0);
+        for (;;) {
+            const std::size_t chunk = source.read(input.data(), bufferSize);
+            entry.write(input.data(), chunk);
+            if (chunk < bufferSize)
+                break;
+        }
+        m_centralDir.add(entry.finish(source.filePath()));
     } catch (...) {
         try {
             m_storage->setLength(start);
@@ -286,71 +402,52 @@ void CZipArchive::addNewFile(CZipAbstractFile& source, const std::wstring& nameI
         }
         throw;
     }
-    m_centralDir.add(std::move(header));
 }
 
-void CZipArchive::writeEntry(CZipAbstractFile& source, CZipFileHeader& header, int level, std::size_t bufferSize)
+void CZipArchive::openNewFile(const std::wstring& nameInZip, int level)
 {
-    const bool reserveZip64 = header.uncompressedSize >= CZipFileHeader::max32 - zip64Margin;
-    const std::string local = header.localRecord(reserveZip64);
-    m_storage->write(local.data(), local.size());
+    CZipFileHeader header = newHeader(nameInZip);
+    m_storage->seekToEnd();
+    m_openEntry = std::make_unique<EntryWriter>(*m_storage, std::move(header), level, defaultTransferBufferSize);
+}
 
-    std::unique_ptr<CZipCompressor> codec = CZipCompressor::forMethod(header.method);
-    if (codec)
-        codec->beginCompression(level);
-    std::vector<unsigned char> input(bufferSize);
-    std::vector<unsigned char> output(codec ? bufferSize : 0);
-    std::uint32_t crc = 0;
-    std::uint64_t readTotal = 0;
-    std::uint64_t writtenTotal = 0;
-    source.seek(0);
-    bool finished = false;
-    while (!finished) {
-        const std::size_t chunk = source.read(input.data(), bufferSize);
-        const bool lastInput = chunk < bufferSize;
-        crc = updateCrc(crc, input.data(), chunk);
-        readTotal += chunk;
-        if (!codec) {
-            m_storage->write(input.data(), chunk);
-            writtenTotal += chunk;
-            finished = lastInput;
-            continue;
-        }
-        std::size_t consumed = 0;
-        do {
-            const CZipCompressor::Progress step =
-                codec->compress(input.data() + consumed, chunk - consumed, output.data(), bufferSize, lastInput);
-            consumed += step.consumed;
-            m_storage->write(output.data(), step.produced);
-            writtenTotal += step.produced;
-            finished = step.finished;
-        } while (consumed < chunk || (lastInput && !finished));
+void CZipArchive::writeNewFile(const void* data, std::size_t size)
+{
+    if (!m_openEntry)
+        throw CZipException(CZipException::internalError);
+    try {
+        m_openEntry->write(static_cast<const unsigned char*>(data), size);
+    } catch (...) {
+        abandonNewFile();
+        throw;
     }
+}
 
-    header.crc32 = crc;
-    header.uncompressedSize = readTotal;
-    header.compressedSize = writtenTotal;
-    if (!reserveZip64 && (readTotal >= CZipFileHeader::max32 || writtenTotal >= CZipFileHeader::max32))
-        throw CZipException(CZipException::tooBigSize, source.filePath());
+void CZipArchive::closeNewFile()
+{
+    if (!m_openEntry)
+        throw CZipException(CZipException::internalError);
+    try {
+        m_centralDir.add(m_openEntry->finish(std::string()));
+        m_openEntry.reset();
+    } catch (...) {
+        abandonNewFile();
+        throw;
+    }
+}
 
-    // Complete the local header now that CRC and sizes are known.
-    const std::uint64_t end = m_storage->position();
-    ZipFieldWriter patch;
-    patch.u32(crc);
-    if (!reserveZip64) {
-        patch.u32(static_cast<std::uint32_t>(writtenTotal));
-        patch.u32(static_cast<std::uint32_t>(readTotal));
+void CZipArchive::abandonNewFile() noexcept
+{
+    if (!m_openEntry)
+        return;
+    const std::uint64_t start = m_openEntry->start();
+    m_openEntry.reset();
+    try {
+        m_storage->setLength(start);
+        m_storage->seek(start);
+    } catch (...) {
+        // Nothing more can be done; the archive is abandoned by the caller.
     }
-    m_storage->seek(header.localHeaderOffset + CZipFileHeader::localCrcOffset);
-    m_storage->write(patch.data().data(), patch.size());
-    if (reserveZip64) {
-        ZipFieldWriter sizes;
-        sizes.u64(readTotal);
-        sizes.u64(writtenTotal);
-        m_storage->seek(header.localHeaderOffset + header.localZip64SizesOffset());
-        m_storage->write(sizes.data().data(), sizes.size());
-    }
-    m_storage->seek(end);
 }
 
 } // namespace quire::zip

@@ -23,7 +23,7 @@ public:
     static constexpr std::uint64_t smallEntrySize = 5;
     static constexpr std::size_t npos = CZipCentralDir::npos;
 
-    CZipArchive() = default;
+    CZipArchive();
     ~CZipArchive();
     CZipArchive(const CZipArchive&) = delete;
     CZipArchive& operator=(const CZipArchive&) = delete;
@@ -64,8 +64,19 @@ public:
     void addNewFile(const std::string& sourcePath, const std::wstring& nameInZip, int level = -1,
                     int options = defaultAddOptions, std::size_t bufferSize = defaultTransferBufferSize);
 
+    // Adds an entry whose data arrives in pieces (it is deflated as it comes, never held
+    // whole): openNewFile, any number of writeNewFile calls, then closeNewFile. A failure, or
+    // abandonNewFile, cuts the archive back to where the entry began.
+    void openNewFile(const std::wstring& nameInZip, int level = -1);
+    void writeNewFile(const void* data, std::size_t size);
+    void closeNewFile();
+    void abandonNewFile() noexcept;
+    bool isEntryOpen() const { return m_openEntry != nullptr; }
+
 private:
+    class EntryWriter;
     void requireMode(OpenMode wanted) const;
+    CZipFileHeader newHeader(const std::wstring& nameInZip) const;
     std::uint64_t seekToEntryData(const CZipFileHeader& header);
     void copyStored(const CZipFileHeader& header, CZipAbstractFile& destination, std::size_t bufferSize);
     void decompressEntry(const CZipFileHeader& header, CZipAbstractFile& destination, std::size_t bufferSize);
@@ -75,6 +86,7 @@ private:
     CZipAbstractFile* m_storage = nullptr;
     OpenMode m_mode = openReadOnly;
     CZipCentralDir m_centralDir;
+    std::unique_ptr<EntryWriter> m_openEntry;
 };
 
 } // namespace quire::zip

@@ -45,6 +45,21 @@ void ZipWriter::addFile(const std::wstring& name, const std::string& sourcePath)
     m_archive.addNewFile(sourcePath, name, -1, CZipArchive::defaultAddOptions, defaultTransferBufferSize);
 }
 
+void ZipWriter::openEntry(const std::string& utf8Name)
+{
+    m_archive.openNewFile(utf8ToWide(utf8Name));
+}
+
+void ZipWriter::writeEntry(const void* data, std::size_t size)
+{
+    m_archive.writeNewFile(data, size);
+}
+
+void ZipWriter::closeEntry()
+{
+    m_archive.closeNewFile();
+}
+
 void ZipWriter::close()
 {
     try {

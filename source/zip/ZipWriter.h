@@ -36,6 +36,11 @@ public:
     void addFile(const std::string& utf8Name, const std::string& sourcePath);
     void addFile(const std::wstring& name, const std::string& sourcePath);
 
+    // An entry written in pieces: deflated as it arrives.
+    void openEntry(const std::string& utf8Name);
+    void writeEntry(const void* data, std::size_t size);
+    void closeEntry();
+
     // Finishes the archive; a file is complete on disk afterwards.
     void close();
     // Drops an unfinished archive; never throws.
