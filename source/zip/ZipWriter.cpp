@@ -45,9 +45,9 @@ void ZipWriter::addFile(const std::wstring& name, const std::string& sourcePath)
     m_archive.addNewFile(sourcePath, name, -1, CZipArchive::defaultAddOptions, defaultTransferBufferSize);
 }
 
-void ZipWriter::openEntry(const std::string& utf8Name)
+void ZipWriter::openEntry(const std::string& utf8Name, int level)
 {
-    m_archive.openNewFile(utf8ToWide(utf8Name));
+    m_archive.openNewFile(utf8ToWide(utf8Name), level);
 }
 
 void ZipWriter::writeEntry(const void* data, std::size_t size)

@@ -36,8 +36,8 @@ public:
     void addFile(const std::string& utf8Name, const std::string& sourcePath);
     void addFile(const std::wstring& name, const std::string& sourcePath);
 
-    // An entry written in pieces: deflated as it arrives.
-    void openEntry(const std::string& utf8Name);
+    // An entry written in pieces: deflated as it arrives (level -1: zlib's default).
+    void openEntry(const std::string& utf8Name, int level = -1);
     void writeEntry(const void* data, std::size_t size);
     void closeEntry();
 
