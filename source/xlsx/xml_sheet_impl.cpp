@@ -8,6 +8,7 @@
 #include "api/enums.h"
 #include "api/number_formats.h"
 #include "api/wide_text.h"
+#include "ooxml/binding/sheet_data_scan.h"
 #include "xlsx/cell_ref.h"
 #include "xlsx/xml_font_impl.h"
 #include "xlsx/xml_format_impl.h"
@@ -34,7 +35,31 @@ void XMLSheetImplT<TCHAR, Tag>::readRows(const std::string& partName, const char
                                          int firstRow, int lastRow) {
     firstRowLimit_ = firstRow;
     lastRowLimit_ = lastRow;
-    this->read(partName, data, size);
+    if (!readCellsDirectly(partName, data, size)) this->read(partName, data, size);
+}
+
+template <class TCHAR, class Tag>
+bool XMLSheetImplT<TCHAR, Tag>::readCellsDirectly(const std::string& partName, const char* data, std::size_t size) {
+    // The cells are read straight from the bytes; the rest of the part, with sheetData left
+    // empty, goes through the general reader.
+    ooxml::sheet_data_span span;
+    if (!ooxml::find_sheet_data(data, size, span)) return false;
+    std::vector<Row> rows;
+    ooxml::sheet_data_scanner<typename SheetData::types> scanner(span.prefix, firstRowLimit_, lastRowLimit_);
+    const char* endTag = scanner.scan(span.content, data + size, rows);
+    if (!endTag) return false;
+    std::string rest(data, static_cast<std::size_t>(span.content - data));
+    rest.append(endTag, static_cast<std::size_t>(data + size - endTag));
+    this->read(partName, rest.data(), rest.size());
+    SheetData* sheetData = this->document().find_sheetData();
+    // A sheetData the general reader did not take as the worksheet's (another namespace).
+    if (!sheetData || sheetData->size_row() != 0) {
+        this->read(partName, data, size);
+        return true;
+    }
+    sheetData->rows() = std::move(rows);
+    usedStale_ = true;
+    return true;
 }
 
 template <class TCHAR, class Tag>
@@ -217,14 +242,22 @@ auto XMLSheetImplT<TCHAR, Tag>::findRow(int row) const -> Row* {
     if (!data || data->size_row() == 0) return nullptr;
     const auto wanted = static_cast<std::uint32_t>(row + 1);
     std::size_t low = 0, high = data->size_row();
-    // Writers append: the last row answers most lookups at once.
+    // Writers append: the last row answers most lookups at once. Readers go row after row:
+    // the row found last, or the one after it, answers most of theirs.
     if (data->get_row(high - 1).get_r() == wanted) return &data->get_row(high - 1);
+    for (std::size_t near = lastFoundRow_; near < lastFoundRow_ + 2 && near < high; ++near)
+        if (data->get_row(near).get_r() == wanted) {
+            lastFoundRow_ = near;
+            return &data->get_row(near);
+        }
     while (low < high) {
         const std::size_t mid = low + (high - low) / 2;
         if (data->get_row(mid).get_r() < wanted) low = mid + 1;
         else high = mid;
     }
-    return low < data->size_row() && data->get_row(low).get_r() == wanted ? &data->get_row(low) : nullptr;
+    if (low >= data->size_row() || data->get_row(low).get_r() != wanted) return nullptr;
+    lastFoundRow_ = low;
+    return &data->get_row(low);
 }
 
 template <class TCHAR, class Tag>

@@ -29,6 +29,8 @@ public:
     void makeEmpty();
     // Reads the part keeping only rows first..last (0-based, -1: no bound).
     void readRows(const std::string& partName, const char* data, std::size_t size, int firstRow, int lastRow);
+    // Reads the cells without the general XML reader where the part allows; false otherwise.
+    bool readCellsDirectly(const std::string& partName, const char* data, std::size_t size);
     void readRowsFromFile(const std::string& partName, const std::string& path, int firstRow, int lastRow);
 
     void bind(Book* book) { book_ = book; }
@@ -213,6 +215,7 @@ private:
     Book* book_ = nullptr;
     std::vector<int> colStyles_;  // default style of each column from cols; -1 none
     bool usedStale_ = true;
+    mutable std::size_t lastFoundRow_ = 0;  // a hint only: checked before use
     int usedFirstRow_ = 0, usedLastRow_ = 0, usedFirstCol_ = 0, usedLastCol_ = 0;
     int firstRowLimit_ = -1;
     int lastRowLimit_ = -1;

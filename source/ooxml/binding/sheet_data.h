@@ -305,6 +305,7 @@ public:
 template <class Types>
 class sheet_data_t {
 public:
+    using types = Types;
     using row_type = row_t<Types>;
     using handler_type = row_handler_t<Types>;
 
