@@ -5,6 +5,7 @@
 #include <charconv>
 #include <cmath>
 
+#include "api/cell_address.h"
 #include "api/enums.h"
 #include "api/number_formats.h"
 #include "api/wide_text.h"
@@ -1367,7 +1368,35 @@ void XMLSheetImplT<TCHAR, Tag>::setGroupSummaryRight(bool right) {
 
 template <class TCHAR, class Tag>
 bool XMLSheetImplT<TCHAR, Tag>::copyCell(int rowSrc, int colSrc, int rowDst, int colDst) {
-    return unsupported<bool>(false);
+    return message().guard(false, [&]() -> bool {
+        checkCell(rowSrc, colSrc);
+        checkCell(rowDst, colDst);
+        const Cell* source = findCell(rowSrc, colSrc);
+        if (!source) throw qrerror("empty cell");
+        if (rowSrc == rowDst && colSrc == colDst) return true;
+        // A copy first: making the destination may move the source within its row.
+        Cell copy = *source;
+        if (auto* f = copy.find_f()) {
+            // The copy of a shared formula's cell stands on its own: its text as the source reads
+            // it; an array formula covers the copy alone.
+            std::wstring text = f->get_value();
+            int masterRow = 0, masterCol = 0;
+            if (f->get_t() == kFormulaShared) {
+                if (text.empty())
+                    if (const Cell* master = sharedMaster(*source, masterRow, masterCol))
+                        text = shiftFormula(master->find_f()->get_value(), rowSrc - masterRow, colSrc - masterCol);
+                f->reset();
+                f->set_value(text);
+            } else if (f->get_t() == kFormulaArray) {
+                f->set_ref(cellRef(rowDst, colDst));
+            }
+        }
+        if (Cell* existing = findCell(rowDst, colDst)) expandSharedFormula(*existing, rowDst, colDst);
+        Cell& target = cellAt(rowDst, colDst, nullptr, true);
+        target = std::move(copy);
+        target.set_ref(static_cast<std::uint32_t>(rowDst), static_cast<std::uint32_t>(colDst));
+        return true;
+    });
 }
 
 template <class TCHAR, class Tag>
@@ -1687,12 +1716,17 @@ void XMLSheetImplT<TCHAR, Tag>::setAutoFitArea(int rowFirst, int colFirst, int r
 
 template <class TCHAR, class Tag>
 void XMLSheetImplT<TCHAR, Tag>::addrToRowCol(const TCHAR* addr, int* row, int* col, bool* rowRelative, bool* colRelative) {
-    unsupported();
+    message().ok();
+    quire::addrToRowCol(addr, row, col, rowRelative, colRelative);
 }
 
 template <class TCHAR, class Tag>
 const TCHAR* XMLSheetImplT<TCHAR, Tag>::rowColToAddr(int row, int col, bool rowRelative, bool colRelative) {
-    return unsupported<const TCHAR*>(nullptr);
+    return message().guard(static_cast<const TCHAR*>(nullptr), [&]() -> const TCHAR* {
+        checkCell(row, col);
+        stringResult_ = quire::rowColToAddr(row, col, rowRelative, colRelative);
+        return stringResult_.c_str();
+    });
 }
 
 template <class TCHAR, class Tag>

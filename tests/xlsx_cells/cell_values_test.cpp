@@ -212,3 +212,46 @@ TEST(RowsAndColumns, RemoveRowsMovesCells) {
 
 }  // namespace
 }  // namespace quire
+
+namespace quire {
+namespace {
+
+TEST(CellCopies, ValueKindAndFormatTravelAndSharedFormulasStandAlone) {
+    const std::string dir = test::makeTempDir("quire-xlsx-copy");
+    auto book = newBook();
+    auto* sheet = book->addSheet(L"S", nullptr);
+    auto* format = book->addFormat(nullptr);
+    format->setNumFormat(NumformatPercent);
+    ASSERT_TRUE(sheet->writeStr(0, 0, L"text", format, 2));
+    ASSERT_TRUE(sheet->writeFormula(0, 1, L"A1&\"!\"", nullptr));
+    EXPECT_TRUE(sheet->copyCell(0, 0, 3, 2));
+    EXPECT_TRUE(sheet->copyCell(0, 1, 0, 0));  // onto a cell of the same row, left of the source
+    EXPECT_STREQ(sheet->readStr(3, 2, nullptr), L"text");
+    EXPECT_EQ(sheet->cellFormat(3, 2)->numFormat(), NumformatPercent);
+    EXPECT_STREQ(sheet->readFormula(0, 0, nullptr), L"A1&\"!\"");
+    EXPECT_FALSE(sheet->copyCell(7, 7, 0, 0));
+    EXPECT_STREQ(book->errorMessage(), "empty cell");
+    EXPECT_FALSE(sheet->copyCell(0, 0, 0, 16384));
+    EXPECT_STREQ(book->errorMessage(), "col must be in range 0-16383");
+
+    auto loaded = reload(*book, dir + "/copy.xlsx");
+    auto* again = loaded->getSheet(0);
+    EXPECT_STREQ(again->readStr(3, 2, nullptr), L"text");
+    EXPECT_STREQ(again->readFormula(0, 0, nullptr), L"A1&\"!\"");
+}
+
+TEST(CellCopies, AddressesUseTheOpenXmlLimits) {
+    auto book = newBook();
+    auto* sheet = book->addSheet(L"S", nullptr);
+    EXPECT_STREQ(sheet->rowColToAddr(1048575, 16383, true, false), L"$XFD1048576");
+    EXPECT_EQ(sheet->rowColToAddr(1048576, 0, true, true), nullptr);
+    int row = 0, col = 0;
+    bool rowRelative = false, colRelative = false;
+    sheet->addrToRowCol(L"XFD1048576", &row, &col, &rowRelative, &colRelative);
+    EXPECT_EQ(row, 1048575);
+    EXPECT_EQ(col, 16383);
+    EXPECT_TRUE(rowRelative);
+}
+
+}  // namespace
+}  // namespace quire
