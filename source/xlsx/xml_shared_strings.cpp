@@ -26,19 +26,28 @@ int SharedStrings<Tag>::add(const std::wstring& text) {
 
 template <class Tag>
 std::wstring SharedStrings<Tag>::get(int index) const {
+    std::wstring text;
+    getInto(index, text);
+    return text;
+}
+
+template <class Tag>
+void SharedStrings<Tag>::getInto(int index, std::wstring& text) const {
     const auto& table = this->document();
     if (index < 0 || static_cast<std::size_t>(index) >= table.size_si())
         throw qrerror("index is out of range or no value");
     const auto* entry = table.rich_si(static_cast<std::size_t>(index));
-    std::wstring text;
     if (!entry) {
         ooxml::read_value(table.plain_si(static_cast<std::size_t>(index)), text);
-        return text;
+        return;
     }
-    if (const auto* t = entry->find_t()) return t->get_value();
+    text.clear();
+    if (const auto* t = entry->find_t()) {
+        text = t->get_value();
+        return;
+    }
     for (std::size_t i = 0; i < entry->size_r(); ++i)
         if (const auto* t = entry->get_r(i).find_t()) text += t->get_value();
-    return text;
 }
 
 template class SharedStrings<excelNormal_tag>;

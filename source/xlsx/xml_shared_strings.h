@@ -15,6 +15,8 @@ public:
     int add(const std::wstring& text);
     // The text of an entry as the file holds it (escapes not decoded).
     std::wstring get(int index) const;
+    // The same into `text`, whose storage is reused.
+    void getInto(int index, std::wstring& text) const;
     int size() const { return static_cast<int>(this->document().size_si()); }
 
 private:

@@ -449,8 +449,10 @@ const TCHAR* XMLSheetImplT<TCHAR, Tag>::readStr(int row, int col, IFormatT<TCHAR
                 stringResult_.clear();
             } else {
                 double index = 0;
-                if (!parseNumber(cell.get_v(), index)) throw qrerror("index is out of range or no value");
-                stringResult_ = decodeXstring(strings->get(static_cast<int>(index)));
+                if (!parseNumber(cell.get_v(), index) || !(index >= 0 && index < 2147483647.0))
+                    throw qrerror("index is out of range or no value");
+                strings->getInto(static_cast<int>(index), stringResult_);
+                if (stringResult_.find(L"_x") != std::wstring::npos) stringResult_ = decodeXstring(stringResult_);
             }
         } else if (type == kTypeStr && cell.isset_v()) {
             stringResult_ = decodeXstring(fromUtf8(std::string(cell.get_v())));
