@@ -2,6 +2,8 @@
 // hands anything beyond plain rows and cells to it.
 #include <gtest/gtest.h>
 
+#include <cstring>
+#include <memory>
 #include <string>
 
 #include "xlsx/xml_sheet_impl.h"
@@ -102,6 +104,46 @@ TEST(DirectReader, RowLimitsKeepOnlyTheAskedRows) {
     sheet.readRows("/xl/worksheets/sheet1.xml", part.data(), part.size(), 1, 5);
     ASSERT_EQ(sheet.document().get_sheetData().size_row(), 1u);
     EXPECT_EQ(sheet.document().get_sheetData().get_row(0).get_r(), 2u);
+}
+
+}  // namespace
+}  // namespace quire
+
+namespace quire {
+namespace {
+
+// Damaged parts either read or fail with a message; the direct reader never reads past them.
+TEST(DirectReader, DamagedPartsReadOrFailWithAMessage) {
+    const std::string good = kHead +
+                             "<sheetData><row r=\"1\" spans=\"1:3\"><c r=\"A1\" t=\"s\"><v>0</v></c><c r=\"B1\" s=\"1\">"
+                             "<f>SUM(A1:A9)&amp;\"x\"</f><v>1.5</v></c><c r=\"C1\" t=\"str\"><v xml:space=\"preserve\"> a </v>"
+                             "</c></row><row><c><v>&#x41;</v></c></row></sheetData>" + kTail;
+    unsigned seed = 12345;
+    const auto next = [&seed] {
+        seed = seed * 1103515245u + 12345u;
+        return (seed >> 16) & 0x7FFF;
+    };
+    int failures = 0;
+    for (int round = 0; round < 3000; ++round) {
+        std::string part = good;
+        if (round % 3 == 0) {
+            part.resize(next() % part.size());
+        } else {
+            for (int flips = 1 + static_cast<int>(next() % 4); flips > 0; --flips)
+                part[next() % part.size()] = static_cast<char>(next() % 256);
+        }
+        // An exact-size copy, so that the sanitizers see any read past the end.
+        std::unique_ptr<char[]> bytes(new char[part.size()]);
+        std::memcpy(bytes.get(), part.data(), part.size());
+        Sheet sheet;
+        try {
+            sheet.readRows("/xl/worksheets/sheet1.xml", bytes.get(), part.size(), -1, -1);
+        } catch (const qrerror& error) {
+            EXPECT_NE(std::string(error.what()), "");
+            ++failures;
+        }
+    }
+    EXPECT_GT(failures, 0);
 }
 
 }  // namespace

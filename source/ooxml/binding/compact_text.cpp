@@ -9,9 +9,9 @@ void compact_text::assign(std::string_view text) {
     if (text.size() < kTag) {
         // The text may be our own (assigning a view of ourselves): copy before releasing.
         unsigned char copy[kTag];
-        std::memcpy(copy, text.data(), text.size());
+        if (!text.empty()) std::memcpy(copy, text.data(), text.size());
         release();
-        std::memcpy(bytes_, copy, text.size());
+        if (!text.empty()) std::memcpy(bytes_, copy, text.size());
         bytes_[kTag] = static_cast<unsigned char>(text.size());
         return;
     }

@@ -148,6 +148,14 @@ const char* read_raw_tag(const char* p, const char* end, raw_tag& tag) {
     }
 }
 
+bool is_plain_text(std::string_view raw) {
+    for (const char ch : raw) {
+        const auto byte = static_cast<unsigned char>(ch);
+        if (byte < 0x20 || byte >= 0x80 || byte == '&' || byte == '<') return false;
+    }
+    return true;
+}
+
 bool decode_raw_text(std::string_view raw, std::string& out, bool attribute) {
     out.clear();
     std::size_t plain = 0;

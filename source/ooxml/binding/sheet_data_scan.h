@@ -36,6 +36,8 @@ const char* read_raw_tag(const char* p, const char* end, raw_tag& tag);
 // Text or an attribute value with its references replaced and line ends normalised; false
 // when it holds anything the direct reader leaves to the general one.
 bool decode_raw_text(std::string_view raw, std::string& out, bool attribute);
+// True when the text has no references, line ends, control characters or non-ASCII bytes.
+bool is_plain_text(std::string_view raw);
 bool is_element(std::string_view qname, std::string_view prefix, std::string_view local);
 const char* skip_white_space(const char* p, const char* end);
 
@@ -58,8 +60,19 @@ private:
     bool cell_attributes(cell_type& cell);
     bool formula_attributes(formula_type& formula);
     // Reads the text of a simple element whose start tag was just read, through its end tag.
-    const char* element_text(const char* p, const char* end, std::string_view local, std::string& text);
+    const char* element_text(const char* p, const char* end, std::string_view local, std::string& buffer,
+                             std::string_view& text);
     bool keep_foreign(std::string_view qname, std::string_view raw, c_foreign& foreign);
+    // The value of an attribute: the raw text itself when it needs no decoding.
+    bool attribute_value(std::string_view raw, std::string_view& value) {
+        if (is_plain_text(raw)) {
+            value = raw;
+            return true;
+        }
+        if (!decode_raw_text(raw, text_, true)) return false;
+        value = text_;
+        return true;
+    }
 
     std::string_view prefix_;
     int first_row_, last_row_;
@@ -85,26 +98,27 @@ bool sheet_data_scanner<Types>::row_attributes(row_type& row) {
             if (!keep_foreign(name, raw, row.foreign_content())) return false;
             continue;
         }
-        if (!decode_raw_text(raw, text_, true)) return false;
+        std::string_view text;
+        if (!attribute_value(raw, text)) return false;
         std::uint32_t number = 0;
         bool flag = false;
         if (name == "r") {
-            if (read_integer_as<std::uint32_t>(text_, number) != lmx::ELMX_OK) return false;
+            if (read_integer_as<std::uint32_t>(text, number) != lmx::ELMX_OK) return false;
             row.set_r(number);
         } else if (name == "spans") {
-            row.set_spans(text_);
+            row.set_spans(text);
         } else if (name == "s") {
-            if (read_integer_as<std::uint32_t>(text_, number) != lmx::ELMX_OK) return false;
+            if (read_integer_as<std::uint32_t>(text, number) != lmx::ELMX_OK) return false;
             row.set_s(number);
         } else if (name == "ht") {
             double height = 0;
-            if (read_value(text_, height) != lmx::ELMX_OK) return false;
+            if (read_value(text, height) != lmx::ELMX_OK) return false;
             row.set_ht(height);
         } else if (name == "outlineLevel") {
-            if (read_integer_as<std::uint8_t>(text_, number) != lmx::ELMX_OK) return false;
+            if (read_integer_as<std::uint8_t>(text, number) != lmx::ELMX_OK) return false;
             row.set_outlineLevel(number);
         } else {
-            if (read_value(text_, flag) != lmx::ELMX_OK) return false;
+            if (read_value(text, flag) != lmx::ELMX_OK) return false;
             if (name == "customFormat") row.set_customFormat(flag);
             else if (name == "hidden") row.set_hidden(flag);
             else if (name == "customHeight") row.set_customHeight(flag);
@@ -125,24 +139,25 @@ bool sheet_data_scanner<Types>::cell_attributes(cell_type& cell) {
             if (!keep_foreign(name, raw, cell.foreign_content())) return false;
             continue;
         }
-        if (!decode_raw_text(raw, text_, true)) return false;
+        std::string_view text;
+        if (!attribute_value(raw, text)) return false;
         std::uint32_t number = 0;
         if (name == "r") {
-            if (!parse_cell_column(text_, number)) return false;
+            if (!parse_cell_column(text, number)) return false;
             cell.set_ref(cell.row(), number);
         } else if (name == "s") {
-            if (read_integer_as<std::uint32_t>(text_, number) != lmx::ELMX_OK) return false;
+            if (read_integer_as<std::uint32_t>(text, number) != lmx::ELMX_OK) return false;
             cell.set_s(number);
         } else if (name == "t") {
             int type = cell_type_default;
-            if (read_enum(text_, k_cell_type_names, 7, type) != lmx::ELMX_OK) return false;
+            if (read_enum(text, k_cell_type_names, 7, type) != lmx::ELMX_OK) return false;
             cell.set_t(type);
         } else if (name == "cm" || name == "vm") {
-            if (read_integer_as<std::uint32_t>(text_, number) != lmx::ELMX_OK) return false;
+            if (read_integer_as<std::uint32_t>(text, number) != lmx::ELMX_OK) return false;
             if (name == "cm") cell.set_cm(number); else cell.set_vm(number);
         } else if (name == "ph") {
             bool flag = false;
-            if (read_value(text_, flag) != lmx::ELMX_OK) return false;
+            if (read_value(text, flag) != lmx::ELMX_OK) return false;
             cell.set_ph(flag);
         } else {
             return false;
@@ -187,9 +202,16 @@ bool sheet_data_scanner<Types>::formula_attributes(formula_type& formula) {
 
 template <class Types>
 const char* sheet_data_scanner<Types>::element_text(const char* p, const char* end, std::string_view local,
-                                                    std::string& text) {
+                                                    std::string& buffer, std::string_view& text) {
     const char* lt = static_cast<const char*>(std::memchr(p, '<', static_cast<std::size_t>(end - p)));
-    if (!lt || !decode_raw_text(std::string_view(p, static_cast<std::size_t>(lt - p)), text, false)) return nullptr;
+    if (!lt) return nullptr;
+    const std::string_view raw(p, static_cast<std::size_t>(lt - p));
+    if (is_plain_text(raw)) {
+        text = raw;
+    } else {
+        if (!decode_raw_text(raw, buffer, false)) return nullptr;
+        text = buffer;
+    }
     const char* next = read_raw_tag(lt, end, tag_);
     if (!next || !tag_.closing || !is_element(tag_.name, prefix_, local)) return nullptr;
     return next;
@@ -198,7 +220,8 @@ const char* sheet_data_scanner<Types>::element_text(const char* p, const char* e
 template <class Types>
 const char* sheet_data_scanner<Types>::scan(const char* p, const char* end, std::vector<row_type>& rows) {
     std::uint32_t row_number = 0;
-    std::string value;
+    std::string buffer;
+    std::string_view value;
     for (;;) {
         p = skip_white_space(p, end);
         if (p >= end || *p != '<') return nullptr;
@@ -249,11 +272,10 @@ const char* sheet_data_scanner<Types>::scan(const char* p, const char* end, std:
                             if (name != "xml:space") return nullptr;
                             preserve = raw == "preserve";
                         }
+                        value = std::string_view();
                         if (!tag_.empty) {
-                            p = element_text(p, end, "v", value);
+                            p = element_text(p, end, "v", buffer, value);
                             if (!p) return nullptr;
-                        } else {
-                            value.clear();
                         }
                         if (preserve) cell.set_preserved_value(value); else cell.set_v(value);
                     } else if (is_element(tag_.name, prefix_, "f") && rank < 0) {
@@ -261,7 +283,7 @@ const char* sheet_data_scanner<Types>::scan(const char* p, const char* end, std:
                         formula_type& formula = cell.get_f();
                         if (!formula_attributes(formula)) return nullptr;
                         if (!tag_.empty) {
-                            p = element_text(p, end, "f", value);
+                            p = element_text(p, end, "f", buffer, value);
                             if (!p) return nullptr;
                             std::wstring wide;
                             if (read_value(value, wide) != lmx::ELMX_OK) return nullptr;
