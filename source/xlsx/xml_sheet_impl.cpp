@@ -6,6 +6,7 @@
 #include <cmath>
 
 #include "api/cell_address.h"
+#include "api/digit_width.h"
 #include "api/enums.h"
 #include "api/number_formats.h"
 #include "api/wide_text.h"
@@ -839,6 +840,17 @@ bool XMLSheetImplT<TCHAR, Tag>::setRowHidden(int row, bool hidden) {
 }
 
 // ---- Columns ----
+
+template <class TCHAR, class Tag>
+int XMLSheetImplT<TCHAR, Tag>::maxDigitWidth() const {
+    constexpr int kWithoutFont = 7;
+    auto* styles = book_ ? book_->findStyles() : nullptr;
+    if (!styles || styles->fontCount() == 0) return kWithoutFont;
+    auto* font = styles->font(0);
+    const TCHAR* name = font->name();
+    const int measured = name ? measureMaxDigitWidth(name, font->size() * 96.0 / 72.0) : 0;
+    return measured > 0 ? measured : kWithoutFont;
+}
 
 template <class TCHAR, class Tag>
 int XMLSheetImplT<TCHAR, Tag>::columnPadding() const {

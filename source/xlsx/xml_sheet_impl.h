@@ -199,7 +199,8 @@ private:
     bool writeFormulaValue(int row, int col, const TCHAR* expr, IFormatT<TCHAR>* format, int kind,
                            double number, const TCHAR* text, bool flag);
     void refreshUsedRange();
-    int maxDigitWidth() const { return 7; }
+    // Of the book's default font (the first of the styles); 7 without one or without the font.
+    int maxDigitWidth() const;
     int columnPadding() const;
     template <class Cols>
     void setColRange(Cols& cols, int first, int last, double width, int style, bool hidden);

@@ -85,7 +85,9 @@ TEST(XlsCorpusFormulas, MalformedTokensFailTheReadWithAMessage) {
         BookPtr loaded = newBinaryBook();
         if (!loaded->loadRaw(bad.data(), static_cast<unsigned>(bad.size()), -1, -1, -1)) continue;
         const wchar_t* text = loaded->getSheet(0)->readFormula(0, 0, nullptr);
-        if (!text) EXPECT_STRNE(loaded->errorMessage(), "ok");
+        if (!text) {
+            EXPECT_STRNE(loaded->errorMessage(), "ok");
+        }
     }
 }
 

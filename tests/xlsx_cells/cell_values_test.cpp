@@ -255,3 +255,30 @@ TEST(CellCopies, AddressesUseTheOpenXmlLimits) {
 
 }  // namespace
 }  // namespace quire
+
+#include "api/digit_width.h"
+
+namespace quire {
+namespace {
+
+TEST(DigitWidth, MeasuredOnTheFontOrAStandInOfTheSameMetrics) {
+    if (!test::haveProgram("fc-list") ||
+        test::runCommand("fc-list | grep -q LiberationSans-Regular", nullptr) != 0)
+        GTEST_SKIP() << "Liberation Sans is not installed";
+    EXPECT_EQ(measureMaxDigitWidth(L"Arial", 10 * 96.0 / 72), 7);
+    EXPECT_EQ(measureMaxDigitWidth(L"Arial", 20 * 96.0 / 72), 15);
+    // Some other family that fontconfig would offer instead does not count.
+    EXPECT_EQ(measureMaxDigitWidth(L"No Such Family At All", 14.0), 0);
+
+    auto book = newBook();
+    auto* sheet = book->addSheet(L"S", nullptr);
+    ASSERT_TRUE(sheet->setCol(0, 0, 8.43, nullptr, false));
+    book->setDefaultFont(L"Arial", 20);
+    // With a maximum digit width of 15: floor((8.43 * 256 + floor(128 / 15)) / 256 * 15).
+    EXPECT_EQ(sheet->colWidthPx(0), 126);
+    // Back from pixels with the padding of that width: (126 - 16 + 3) / 15.
+    EXPECT_DOUBLE_EQ(sheet->colWidth(0), 7.53);
+}
+
+}  // namespace
+}  // namespace quire
