@@ -52,7 +52,13 @@ bool XMLSheetImplT<TCHAR, Tag>::readCellsDirectly(const std::string& partName, c
     if (!endTag) return false;
     std::string rest(data, static_cast<std::size_t>(span.content - data));
     rest.append(endTag, static_cast<std::size_t>(data + size - endTag));
-    this->read(partName, rest.data(), rest.size());
+    try {
+        this->read(partName, rest.data(), rest.size());
+    } catch (const qrerror&) {
+        // Read again whole, so that the message gives the line of the part itself.
+        this->read(partName, data, size);
+        return true;
+    }
     SheetData* sheetData = this->document().find_sheetData();
     // A sheetData the general reader did not take as the worksheet's (another namespace).
     if (!sheetData || sheetData->size_row() != 0) {

@@ -97,6 +97,20 @@ TEST(DirectReader, MalformedPartsFailWithTheGeneralReadersMessage) {
     }
 }
 
+TEST(DirectReader, AFaultAfterTheCellsIsReportedAtItsOwnLine) {
+    std::string rows;
+    for (int r = 1; r <= 40; ++r) rows += "<row r=\"" + std::to_string(r) + "\">\n<c><v>1</v></c></row>\n";
+    const std::string part = kHead + "<sheetData>" + rows + "</sheetData><mergeCells><mergeCell/></mergeCells>" + kTail;
+    Sheet sheet;
+    std::string message;
+    try {
+        sheet.readRows("/xl/worksheets/sheet1.xml", part.data(), part.size(), -1, -1);
+    } catch (const qrerror& error) {
+        message = error.what();
+    }
+    EXPECT_NE(message.find("at line 82"), std::string::npos) << message;
+}
+
 TEST(DirectReader, RowLimitsKeepOnlyTheAskedRows) {
     const std::string part = kHead + "<sheetData><row r=\"1\"><c r=\"A1\"><v>1</v></c></row><row><c><v>2</v></c></row>"
                                      "<row r=\"7\"><c r=\"A7\"><v>7</v></c></row></sheetData>" + kTail;
