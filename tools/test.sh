@@ -5,6 +5,7 @@ cd "$(dirname "$0")/.."
 tools/install-deps.sh
 export ASAN_OPTIONS=detect_leaks=1:abort_on_error=1
 export UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1
+export LSAN_OPTIONS="suppressions=$PWD/tools/lsan.supp"
 
 run_suite() {
   local dir=$1; shift
