@@ -49,7 +49,8 @@ public:
     using formula_type = typename Types::formula;
 
     sheet_data_scanner(std::string_view prefix, int first_row, int last_row)
-        : prefix_(prefix), first_row_(first_row), last_row_(last_row) {}
+        : prefix_(prefix), first_row_(first_row), last_row_(last_row), row_(qualified("row")), cell_(qualified("c")),
+          value_(qualified("v")), formula_(qualified("f")), sheet_data_(qualified("sheetData")) {}
 
     // Reads the content from p up to the end tag of sheetData; returns where that end tag
     // starts, or null when the general reader must do it.
@@ -60,7 +61,7 @@ private:
     bool cell_attributes(cell_type& cell);
     bool formula_attributes(formula_type& formula);
     // Reads the text of a simple element whose start tag was just read, through its end tag.
-    const char* element_text(const char* p, const char* end, std::string_view local, std::string& buffer,
+    const char* element_text(const char* p, const char* end, const std::string& local, std::string& buffer,
                              std::string_view& text);
     bool keep_foreign(std::string_view qname, std::string_view raw, c_foreign& foreign);
     // The value of an attribute: the raw text itself when it needs no decoding.
@@ -74,8 +75,16 @@ private:
         return true;
     }
 
+    std::string qualified(const char* local) const { return std::string(prefix_) + local; }
+    // Names are compared often: as the file spells them, prefix included, made once.
+    static bool is(std::string_view name, const std::string& qualified_name) {
+        return name.size() == qualified_name.size() && !name.empty() && name[0] == qualified_name[0] &&
+               std::memcmp(name.data() + 1, qualified_name.data() + 1, name.size() - 1) == 0;
+    }
+
     std::string_view prefix_;
     int first_row_, last_row_;
+    const std::string row_, cell_, value_, formula_, sheet_data_;
     raw_tag tag_;
     std::string text_;
 };
@@ -201,7 +210,7 @@ bool sheet_data_scanner<Types>::formula_attributes(formula_type& formula) {
 }
 
 template <class Types>
-const char* sheet_data_scanner<Types>::element_text(const char* p, const char* end, std::string_view local,
+const char* sheet_data_scanner<Types>::element_text(const char* p, const char* end, const std::string& local,
                                                     std::string& buffer, std::string_view& text) {
     const char* lt = static_cast<const char*>(std::memchr(p, '<', static_cast<std::size_t>(end - p)));
     if (!lt) return nullptr;
@@ -213,7 +222,7 @@ const char* sheet_data_scanner<Types>::element_text(const char* p, const char* e
         text = buffer;
     }
     const char* next = read_raw_tag(lt, end, tag_);
-    if (!next || !tag_.closing || !is_element(tag_.name, prefix_, local)) return nullptr;
+    if (!next || !tag_.closing || !is(tag_.name, local)) return nullptr;
     return next;
 }
 
@@ -228,8 +237,8 @@ const char* sheet_data_scanner<Types>::scan(const char* p, const char* end, std:
         const char* at = p;
         p = read_raw_tag(p, end, tag_);
         if (!p) return nullptr;
-        if (tag_.closing) return is_element(tag_.name, prefix_, "sheetData") ? at : nullptr;
-        if (!is_element(tag_.name, prefix_, "row")) return nullptr;
+        if (tag_.closing) return is(tag_.name, sheet_data_) ? at : nullptr;
+        if (!is(tag_.name, row_)) return nullptr;
         row_type row;
         if (!row_attributes(row)) return nullptr;
         if (!row.isset_r()) row.set_position(row_number + 1);
@@ -245,10 +254,10 @@ const char* sheet_data_scanner<Types>::scan(const char* p, const char* end, std:
                 p = read_raw_tag(p, end, tag_);
                 if (!p) return nullptr;
                 if (tag_.closing) {
-                    if (!is_element(tag_.name, prefix_, "row")) return nullptr;
+                    if (!is(tag_.name, row_)) return nullptr;
                     break;
                 }
-                if (!is_element(tag_.name, prefix_, "c")) return nullptr;
+                if (!is(tag_.name, cell_)) return nullptr;
                 cell_type& cell = row.append_c();
                 cell.move_to_row(row_number - 1);
                 cell.set_column(next_column > 16383 ? 16383 : next_column);
@@ -262,10 +271,10 @@ const char* sheet_data_scanner<Types>::scan(const char* p, const char* end, std:
                     p = read_raw_tag(p, end, tag_);
                     if (!p) return nullptr;
                     if (tag_.closing) {
-                        if (!is_element(tag_.name, prefix_, "c")) return nullptr;
+                        if (!is(tag_.name, cell_)) return nullptr;
                         break;
                     }
-                    if (is_element(tag_.name, prefix_, "v") && rank < 1) {
+                    if (is(tag_.name, value_) && rank < 1) {
                         rank = 1;
                         bool preserve = false;
                         for (const auto& [name, raw] : tag_.attributes) {
@@ -274,16 +283,16 @@ const char* sheet_data_scanner<Types>::scan(const char* p, const char* end, std:
                         }
                         value = std::string_view();
                         if (!tag_.empty) {
-                            p = element_text(p, end, "v", buffer, value);
+                            p = element_text(p, end, value_, buffer, value);
                             if (!p) return nullptr;
                         }
                         if (preserve) cell.set_preserved_value(value); else cell.set_v(value);
-                    } else if (is_element(tag_.name, prefix_, "f") && rank < 0) {
+                    } else if (is(tag_.name, formula_) && rank < 0) {
                         rank = 0;
                         formula_type& formula = cell.get_f();
                         if (!formula_attributes(formula)) return nullptr;
                         if (!tag_.empty) {
-                            p = element_text(p, end, "f", buffer, value);
+                            p = element_text(p, end, formula_, buffer, value);
                             if (!p) return nullptr;
                             std::wstring wide;
                             if (read_value(value, wide) != lmx::ELMX_OK) return nullptr;

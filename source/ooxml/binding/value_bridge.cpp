@@ -8,12 +8,17 @@ namespace quire::ooxml {
 
 lmx::elmx_error read_value(std::string_view text, std::wstring& value) {
     // The scanner has checked the UTF-8 already; this only decodes it.
-    value.clear();
-    value.reserve(text.size());
+    // Never more characters than bytes: written in place, then cut to the count.
+    value.resize(text.size());
+    wchar_t* out = value.data();
     const auto* p = reinterpret_cast<const unsigned char*>(text.data());
     const auto* end = p + text.size();
     while (p < end) {
         unsigned c = *p++;
+        if (c < 0x80) {
+            *out++ = static_cast<wchar_t>(c);
+            continue;
+        }
         int more = 0;
         if (c >= 0xF0) {
             c &= 0x07;
@@ -24,15 +29,20 @@ lmx::elmx_error read_value(std::string_view text, std::wstring& value) {
         } else if (c >= 0xC0) {
             c &= 0x1F;
             more = 1;
-        } else if (c >= 0x80) {
+        } else {
+            value.clear();
             return lmx::ELMX_BAD_CHAR_ENCODING;
         }
         for (; more > 0; --more) {
-            if (p >= end || (*p & 0xC0) != 0x80) return lmx::ELMX_BAD_CHAR_ENCODING;
+            if (p >= end || (*p & 0xC0) != 0x80) {
+                value.clear();
+                return lmx::ELMX_BAD_CHAR_ENCODING;
+            }
             c = (c << 6) | (*p++ & 0x3F);
         }
-        value += static_cast<wchar_t>(c);
+        *out++ = static_cast<wchar_t>(c);
     }
+    value.resize(static_cast<std::size_t>(out - value.data()));
     return lmx::ELMX_OK;
 }
 
