@@ -92,12 +92,7 @@ public:
 
     void write(const std::string& fileName, std::string& buffer) override {
         std::string text;
-        {
-            lmx::c_xml_writer writer(text, lmx::c_xml_writer::flag_declaration | lmx::c_xml_writer::flag_standalone);
-            const lmx::elmx_error result = document_.marshal(writer, rootName_);
-            if (result != lmx::ELMX_OK) throw qrerror(std::string(lmx::error_message(result)));
-        }
-        text += "\n";
+        writeTo([&text](const char* data, std::size_t size) { text.append(data, size); });
         if (fileName.empty()) buffer.swap(text);
         else writeXmlText(fileName, buffer, text);
     }

@@ -350,9 +350,8 @@ inline int child_rank(std::string_view name, std::initializer_list<const char*> 
 }
 
 template <class Object>
-lmx::elmx_error keep_foreign_attribute(Object& object, const lmx::c_xml_attribute& attribute) {
+void keep_foreign_attribute(Object& object, const lmx::c_xml_attribute& attribute) {
     if (!lmx::c_xml_reader::is_runtime_attribute(attribute)) object.foreign_content().add_attribute(attribute);
-    return lmx::ELMX_OK;
 }
 
 }  // namespace detail

@@ -1,6 +1,11 @@
 #include "ooxml/binding/sheet_data_scan.h"
 
 #include <cstring>
+#include <iterator>
+
+#include <utf8.h>
+
+#include "xml/character_encoding.h"
 
 namespace quire::ooxml {
 
@@ -27,42 +32,6 @@ bool xml_char(std::uint32_t code) {
            (code >= 0xE000 && code <= 0xFFFD) || (code >= 0x10000 && code <= 0x10FFFF);
 }
 
-void append_code(std::string& out, std::uint32_t code) {
-    if (code < 0x80) {
-        out += static_cast<char>(code);
-    } else if (code < 0x800) {
-        out += static_cast<char>(0xC0 | (code >> 6));
-        out += static_cast<char>(0x80 | (code & 0x3F));
-    } else if (code < 0x10000) {
-        out += static_cast<char>(0xE0 | (code >> 12));
-        out += static_cast<char>(0x80 | ((code >> 6) & 0x3F));
-        out += static_cast<char>(0x80 | (code & 0x3F));
-    } else {
-        out += static_cast<char>(0xF0 | (code >> 18));
-        out += static_cast<char>(0x80 | ((code >> 12) & 0x3F));
-        out += static_cast<char>(0x80 | ((code >> 6) & 0x3F));
-        out += static_cast<char>(0x80 | (code & 0x3F));
-    }
-}
-
-// The length of a valid UTF-8 sequence of an XML character at p, or 0.
-std::size_t utf8_sequence(const unsigned char* p, const unsigned char* end) {
-    const unsigned lead = *p;
-    std::size_t length;
-    std::uint32_t code;
-    if (lead >= 0xC2 && lead <= 0xDF) { length = 2; code = lead & 0x1F; }
-    else if (lead >= 0xE0 && lead <= 0xEF) { length = 3; code = lead & 0x0F; }
-    else if (lead >= 0xF0 && lead <= 0xF4) { length = 4; code = lead & 0x07; }
-    else return 0;
-    if (static_cast<std::size_t>(end - p) < length) return 0;
-    for (std::size_t i = 1; i < length; ++i) {
-        if ((p[i] & 0xC0) != 0x80) return 0;
-        code = (code << 6) | (p[i] & 0x3F);
-    }
-    const std::uint32_t least[] = {0, 0, 0x80, 0x800, 0x10000};
-    return code >= least[length] && xml_char(code) ? length : 0;
-}
-
 bool reference(std::string_view name, std::string& out) {
     if (name == "lt") out += '<';
     else if (name == "gt") out += '>';
@@ -84,7 +53,7 @@ bool reference(std::string_view name, std::string& out) {
             code = code * (hex ? 16 : 10) + digit;
         }
         if (!xml_char(code)) return false;
-        append_code(out, code);
+        utf8::unchecked::append(code, std::back_inserter(out));
     } else {
         return false;
     }
@@ -96,11 +65,6 @@ bool reference(std::string_view name, std::string& out) {
 const char* skip_white_space(const char* p, const char* end) {
     while (p < end && white(*p)) ++p;
     return p;
-}
-
-bool is_element(std::string_view qname, std::string_view prefix, std::string_view local) {
-    return qname.size() == prefix.size() + local.size() && qname.compare(0, prefix.size(), prefix) == 0 &&
-           qname.compare(prefix.size(), local.size(), local) == 0;
 }
 
 const char* read_raw_tag(const char* p, const char* end, raw_tag& tag) {
@@ -148,26 +112,33 @@ const char* read_raw_tag(const char* p, const char* end, raw_tag& tag) {
     }
 }
 
-bool is_plain_text(std::string_view raw) {
-    for (const char ch : raw) {
-        const auto byte = static_cast<unsigned char>(ch);
-        if (byte < 0x20 || byte >= 0x80 || byte == '&' || byte == '<') return false;
+namespace {
+
+// The length of the start of a text that needs no decoding.
+std::size_t plain_prefix(std::string_view raw) {
+    std::size_t plain = 0;
+    while (plain < raw.size()) {
+        const auto byte = static_cast<unsigned char>(raw[plain]);
+        if (byte < 0x20 || byte >= 0x80 || byte == '&' || byte == '<') break;
+        ++plain;
     }
-    return true;
+    return plain;
 }
+
+}  // namespace
+
+bool is_plain_text(std::string_view raw) { return plain_prefix(raw) == raw.size(); }
 
 bool decode_raw_text(std::string_view raw, std::string& out, bool attribute) {
     out.clear();
-    std::size_t plain = 0;
-    while (plain < raw.size()) {
-        const auto ch = static_cast<unsigned char>(raw[plain]);
-        if (ch < 0x20 || ch >= 0x80 || ch == '&' || ch == '<') break;
-        ++plain;
-    }
+    const std::size_t plain = plain_prefix(raw);
     if (plain == raw.size()) {
         out.assign(raw);
         return true;
     }
+    // Broken UTF-8, and characters XML cannot carry, are left to the general reader.
+    if (lmx::find_invalid_xml_utf8(raw.data() + plain, raw.data() + raw.size()) != raw.data() + raw.size())
+        return false;
     out.assign(raw.data(), plain);
     const auto* p = reinterpret_cast<const unsigned char*>(raw.data()) + plain;
     const auto* end = reinterpret_cast<const unsigned char*>(raw.data()) + raw.size();
@@ -185,13 +156,8 @@ bool decode_raw_text(std::string_view raw, std::string& out, bool attribute) {
         } else if (ch == '\n' || ch == '\t') {
             out += attribute ? ' ' : static_cast<char>(ch);
             ++p;
-        } else if (ch < 0x20 || ch == '<') {
+        } else if (ch == '<') {
             return false;
-        } else if (ch >= 0x80) {
-            const std::size_t length = utf8_sequence(p, end);
-            if (length == 0) return false;
-            out.append(reinterpret_cast<const char*>(p), length);
-            p += length;
         } else {
             out += static_cast<char>(ch);
             ++p;

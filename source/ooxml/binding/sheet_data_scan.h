@@ -38,7 +38,6 @@ const char* read_raw_tag(const char* p, const char* end, raw_tag& tag);
 bool decode_raw_text(std::string_view raw, std::string& out, bool attribute);
 // True when the text has no references, line ends, control characters or non-ASCII bytes.
 bool is_plain_text(std::string_view raw);
-bool is_element(std::string_view qname, std::string_view prefix, std::string_view local);
 const char* skip_white_space(const char* p, const char* end);
 
 template <class Types>
